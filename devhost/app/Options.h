@@ -1,0 +1,15 @@
+// devhost.exe's command line.
+#pragma once
+
+#include <string>
+#include <vector>
+
+struct HostOptions {
+  bool batch = false;
+  std::vector<std::wstring> evals;
+  std::wstring modulePath;  // empty: Lumvex1.arx beside the program
+  int drawings = 1;
+  std::wstring error;       // non-empty when the command line could not be read
+};
+
+HostOptions ParseOptions(const std::vector<std::wstring> &args);

@@ -1,0 +1,123 @@
+// devhost.exe: loads the module as the CAD application does and offers an AutoLISP command
+// line, interactive or in batch (--batch --eval EXPR ...).
+#include "app/CommandSession.h"
+#include "app/MainWindow.h"
+#include "app/Options.h"
+#include "runtime/TestApi.h"
+
+#include <windows.h>
+#include <commctrl.h>
+#include <fcntl.h>
+#include <io.h>
+#include <ole2.h>
+#include <shellapi.h>
+
+#include <cstdio>
+#include <string>
+#include <vector>
+
+namespace {
+constexpr int kExitModuleNotLoaded = 2;
+constexpr int kExitBadOptions = 64;
+
+std::vector<std::wstring> CommandLineArguments() {
+  int count = 0;
+  LPWSTR *argv = CommandLineToArgvW(GetCommandLineW(), &count);
+  std::vector<std::wstring> args;
+  for (int i = 1; i < count; ++i) args.emplace_back(argv[i]);
+  LocalFree(argv);
+  return args;
+}
+
+std::wstring DefaultModulePath() {
+  wchar_t path[MAX_PATH] = L"";
+  const DWORD length = GetModuleFileNameW(nullptr, path, MAX_PATH);
+  std::wstring folder(path, length);
+  folder.erase(folder.find_last_of(L"\\/") + 1);
+  return folder + L"Lumvex1.arx";
+}
+
+void WriteStdout(const std::wstring &text) {
+  const int bytes = WideCharToMultiByte(CP_ACP, 0, text.data(), static_cast<int>(text.size()), nullptr, 0, nullptr, nullptr);
+  std::string narrow(static_cast<size_t>(bytes), '\0');
+  WideCharToMultiByte(CP_ACP, 0, text.data(), static_cast<int>(text.size()), narrow.data(), bytes, nullptr, nullptr);
+  std::fwrite(narrow.data(), 1, narrow.size(), stdout);
+  std::fflush(stdout);
+}
+
+void ForwardPrinted(const wchar_t *text, void *session) { static_cast<CommandSession *>(session)->Write(text); }
+
+const wchar_t *LoadErrorText(int error) {
+  switch (error) {
+  case kDevhostNoSuchModule: return L"the file is missing or is not a loadable module";
+  case kDevhostNoEntryPoint: return L"it exports no acrxEntryPoint/acrxGetApiVersion";
+  case kDevhostWrongApiVersion: return L"it was built for another ObjectARX release";
+  default: return L"unknown failure";
+  }
+}
+
+struct OleSession {
+  OleSession() { OleInitialize(nullptr); }
+  ~OleSession() { OleUninitialize(); }
+};
+
+int RunInteractive(MainWindow &window, CommandSession &session, const HostOptions &options) {
+  window.Show();
+  for (const std::wstring &expression : options.evals) {
+    session.Write(L"Command: " + expression + L"\n");
+    session.Evaluate(expression);
+  }
+  MSG message;
+  while (GetMessageW(&message, nullptr, 0, 0) > 0) {
+    TranslateMessage(&message);
+    DispatchMessageW(&message);
+  }
+  return 0;
+}
+}  // namespace
+
+int main() {
+  _setmode(_fileno(stdout), _O_BINARY);
+  _setmode(_fileno(stderr), _O_BINARY);
+  const HostOptions options = ParseOptions(CommandLineArguments());
+  if (!options.error.empty()) {
+    std::fprintf(stderr, "devhost: %ls\nusage: devhost [--batch] [--eval EXPR]... [--module PATH] [--drawings N]\n",
+                 options.error.c_str());
+    return kExitBadOptions;
+  }
+
+  OleSession ole;
+  INITCOMMONCONTROLSEX controls{sizeof controls, ICC_WIN95_CLASSES};
+  InitCommonControlsEx(&controls);
+  devhostSetBatchMode(options.batch);
+
+  MainWindow window;
+  CommandSession session([&window, &options](const std::wstring &text) {
+    // The interactive command line is echoed on standard output too, for whoever started the host.
+    WriteStdout(text);
+    if (!options.batch) window.AppendHistory(text);
+  });
+  devhostSetOutputSink(ForwardPrinted, &session);
+  const bool hasWindow = window.Create(GetModuleHandleW(nullptr),
+                                       [&session](const std::wstring &line) {
+                                         session.Write(L"Command: " + line + L"\n");
+                                         session.Evaluate(line);
+                                       },
+                                       [] { devhostUnloadModule(); });
+  if (hasWindow) devhostSetWindows(window.Frame(), window.DrawingView());
+
+  for (int i = 0; i < options.drawings; ++i) devhostOpenDrawing();
+  const std::wstring modulePath = options.modulePath.empty() ? DefaultModulePath() : options.modulePath;
+  const int loaded = devhostLoadModule(modulePath.c_str());
+  if (loaded != kDevhostLoaded) {
+    std::fprintf(stderr, "devhost: cannot load %ls: %ls\n", modulePath.c_str(), LoadErrorText(loaded));
+    return kExitModuleNotLoaded;
+  }
+
+  if (!options.batch && hasWindow) return RunInteractive(window, session, options);
+
+  for (const std::wstring &expression : options.evals) session.Evaluate(expression);
+  devhostUnloadModule();
+  if (hasWindow) DestroyWindow(window.Frame());
+  return 0;
+}

@@ -1,0 +1,39 @@
+// The application object of a module: constructed statically, initialised when the module loads.
+#pragma once
+
+#include <windows.h>
+
+namespace fw {
+
+class CWinApp {
+public:
+  CWinApp();
+  virtual ~CWinApp();
+  CWinApp(const CWinApp &) = delete;
+  CWinApp &operator=(const CWinApp &) = delete;
+
+  virtual BOOL InitInstance() { return TRUE; }
+  virtual int ExitInstance() { return 0; }
+
+  HINSTANCE m_hInstance = nullptr;
+};
+
+CWinApp *AfxGetApp();
+// The module whose dialogs, menus and strings are loaded.
+HINSTANCE AfxGetResourceHandle();
+void AfxSetResourceHandle(HINSTANCE instance);
+
+// Makes this module's resources current for the lifetime of the scope, restoring the previous
+// ones after: a host calls into several modules on one thread.
+class CModuleStateScope {
+public:
+  CModuleStateScope();
+  ~CModuleStateScope();
+  CModuleStateScope(const CModuleStateScope &) = delete;
+  CModuleStateScope &operator=(const CModuleStateScope &) = delete;
+
+private:
+  HINSTANCE m_previous;
+};
+
+}  // namespace fw

@@ -1,0 +1,6 @@
+#include "host/ModuleGlobals.h"
+
+HMODULE g_hModule = nullptr;
+char g_szAcceptCaption[56] = "";
+char g_szCancelCaption[56] = "";
+char g_szStartShellPath[260] = "";

@@ -1,0 +1,9 @@
+// Module-wide values set when the module loads and at the start of each browse call.
+#pragma once
+
+#include <windows.h>
+
+extern HMODULE g_hModule;
+extern char g_szAcceptCaption[56];
+extern char g_szCancelCaption[56];
+extern char g_szStartShellPath[260];

@@ -1,0 +1,11 @@
+// Text crosses between the host's wide text and the module's narrow ANSI text here.
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+std::string ToAnsi(const wchar_t *text);
+std::wstring ToWide(const char *text);
+// Copies as much of the text as fits the buffer with its terminator, never splitting a
+// double-byte character.
+void CopyAnsiCut(const std::string &text, char *buffer, size_t capacity);

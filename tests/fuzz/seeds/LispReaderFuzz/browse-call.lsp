@@ -1,0 +1,1 @@
+(Lumvex 0 0 "Z:\\work\\drawings\\" "Insert" "Close")

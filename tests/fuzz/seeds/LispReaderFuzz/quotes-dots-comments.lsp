@@ -1,0 +1,2 @@
+'(a . (b 'c)) ;| block |; ; line comment
+(nil t T NIL ())

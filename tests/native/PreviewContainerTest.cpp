@@ -1,0 +1,227 @@
+// The preview directory of drawings: real files from CAD applications, and damaged or hostile
+// ones built in memory.
+#include "PreviewTestFiles.h"
+#include "preview/DibDecoder.h"
+#include "preview/PreviewDirectory.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+
+using namespace devhost::preview;
+using previewtest::Bytes;
+
+namespace {
+
+// Counts what a parse costs, so the tests can hold it to "header and picture only".
+class CountingSource final : public PreviewSource {
+public:
+  explicit CountingSource(const Bytes &bytes) : m_inner(bytes.data(), bytes.size()) {}
+  uint64_t size() const override { return m_inner.size(); }
+  bool read(uint64_t offset, void *into, size_t count) override {
+    m_bytesRead += count;
+    return m_inner.read(offset, into, count);
+  }
+  uint64_t bytesRead() const { return m_bytesRead; }
+
+private:
+  MemorySource m_inner;
+  uint64_t m_bytesRead = 0;
+};
+
+std::filesystem::path fixtureFolder() { return std::filesystem::path(LUMVEX_FIXTURES_DIR) / "dwg"; }
+
+Bytes readFile(const std::filesystem::path &path) {
+  std::ifstream in(path, std::ios::binary);
+  return Bytes(std::istreambuf_iterator<char>(in), {});
+}
+
+std::optional<PreviewDirectory> directoryOf(const Bytes &file) {
+  MemorySource source(file.data(), file.size());
+  return readPreviewDirectory(source);
+}
+
+std::vector<PreviewEntry> picturesOf(const Bytes &file) {
+  auto directory = directoryOf(file);
+  return directory ? picturesByPreference(*directory) : std::vector<PreviewEntry>{};
+}
+
+struct FixtureCase {
+  const char *file;
+  bool hasDirectory;
+  size_t entryCount;
+  uint8_t chosenCode; // 0: no picture
+  uint32_t chosenSize;
+  uint32_t width, height; // of a chosen bitmap
+};
+
+const FixtureCase kFixtures[] = {
+    {"r14-example.dwg", true, 2, kBitmap, 31304, 216, 140},
+    {"r2000-arc.dwg", true, 2, kBitmap, 27176, 256, 102},
+    {"r2004-hatch.dwg", true, 2, kBitmap, 21856, 184, 113},
+    {"r2007-two-bitmaps.dwg", true, 3, kBitmap, 163880, 256, 160},
+    {"r2010-line.dwg", true, 2, kBitmap, 27176, 256, 102},
+    {"r2013-arc-png.dwg", true, 2, kPng, 1088, 0, 0},
+    {"r2013-leader-png.dwg", true, 2, kPng, 14976, 0, 0},
+    {"r2018-header-only.dwg", true, 1, 0, 0, 0, 0},
+    {"r2018-no-images.dwg", true, 0, 0, 0, 0, 0},
+    {"r11-no-preview.dwg", false, 0, 0, 0, 0, 0},
+};
+
+} // namespace
+
+TEST(PreviewFixtures, DirectoryPictureChoiceAndBytesRead) {
+  if (!std::filesystem::is_directory(fixtureFolder()))
+    GTEST_SKIP() << "no fixtures at " << fixtureFolder();
+  for (const FixtureCase &c : kFixtures) {
+    SCOPED_TRACE(c.file);
+    const Bytes file = readFile(fixtureFolder() / c.file);
+    ASSERT_FALSE(file.empty());
+    CountingSource source(file);
+    const auto directory = readPreviewDirectory(source);
+    ASSERT_EQ(directory.has_value(), c.hasDirectory);
+    if (!directory)
+      continue;
+    EXPECT_EQ(directory->entries.size(), c.entryCount);
+    if (c.entryCount != 0)
+      EXPECT_EQ(directory->entries.front().code, kHeaderData);
+
+    const auto pictures = picturesByPreference(*directory);
+    if (c.chosenCode == 0) {
+      EXPECT_TRUE(pictures.empty());
+      continue;
+    }
+    ASSERT_FALSE(pictures.empty());
+    EXPECT_EQ(pictures.front().code, c.chosenCode);
+    EXPECT_EQ(pictures.front().size, c.chosenSize);
+
+    Bytes picture;
+    ASSERT_TRUE(readEntryBytes(source, pictures.front(), picture));
+    // The drawing itself is never read: only the directory and the chosen picture.
+    EXPECT_LE(source.bytesRead(), picture.size() + 4096);
+    if (c.chosenCode == kPng) {
+      const uint8_t signature[8] = {0x89, 'P', 'N', 'G', '\r', '\n', 0x1A, '\n'};
+      EXPECT_EQ(0, std::memcmp(picture.data(), signature, 8));
+      continue;
+    }
+    DecodedPicture decoded;
+    ASSERT_TRUE(decodeDib(picture.data(), picture.size(), decoded));
+    EXPECT_EQ(decoded.width, c.width);
+    EXPECT_EQ(decoded.height, c.height);
+  }
+}
+
+TEST(PreviewFixtures, EveryBitmapOfEveryFixtureDecodes) {
+  if (!std::filesystem::is_directory(fixtureFolder()))
+    GTEST_SKIP() << "no fixtures at " << fixtureFolder();
+  int bitmaps = 0;
+  for (const auto &item : std::filesystem::directory_iterator(fixtureFolder())) {
+    if (item.path().extension() != ".dwg")
+      continue;
+    SCOPED_TRACE(item.path().filename().string());
+    const Bytes file = readFile(item.path());
+    const auto pictures = picturesOf(file);
+    for (const PreviewEntry &entry : pictures) {
+      if (entry.code != kBitmap)
+        continue;
+      ++bitmaps;
+      DecodedPicture decoded;
+      ASSERT_TRUE(decodeDib(file.data() + entry.start, entry.size, decoded));
+      bool varied = false;
+      for (uint32_t pixel : decoded.pixels) {
+        varied = varied || pixel != decoded.pixels.front();
+        ASSERT_EQ(pixel >> 24, 0xFFu);
+      }
+      // The chosen picture is a line drawing; a second, smaller one may be left blank.
+      if (entry.start == pictures.front().start)
+        EXPECT_TRUE(varied);
+    }
+  }
+  EXPECT_EQ(bitmaps, 6);
+}
+
+TEST(PreviewDirectoryHostile, MissingOrDamagedDirectoryIsRefused) {
+  const Bytes good = previewtest::buildDrawing({previewtest::headerData(), {kBitmap, Bytes(100, 1)}});
+  ASSERT_TRUE(directoryOf(good));
+
+  EXPECT_FALSE(directoryOf(Bytes()));
+  EXPECT_FALSE(directoryOf(Bytes(good.begin(), good.begin() + 0x10))) << "address cut off";
+
+  Bytes pastEnd = good;
+  previewtest::set32(pastEnd, 0x0D, uint32_t(good.size() - 10));
+  EXPECT_FALSE(directoryOf(pastEnd)) << "directory runs past the end";
+  previewtest::set32(pastEnd, 0x0D, 0xFFFFFFFF);
+  EXPECT_FALSE(directoryOf(pastEnd)) << "address far past the end";
+  previewtest::set32(pastEnd, 0x0D, 0x0D);
+  EXPECT_FALSE(directoryOf(pastEnd)) << "address pointing at itself";
+
+  Bytes wrongSentinel = good;
+  wrongSentinel[previewtest::kDirectoryAddress + 15] ^= 1;
+  EXPECT_FALSE(directoryOf(wrongSentinel));
+
+  // A count whose table would run past the end of the file.
+  Bytes tooMany(good.begin(), good.begin() + long(previewtest::kDirectoryAddress + 21 + 18));
+  tooMany[previewtest::kDirectoryAddress + 20] = 255;
+  EXPECT_FALSE(directoryOf(tooMany));
+}
+
+TEST(PreviewDirectoryHostile, EntriesOutsideTheFileAreDropped) {
+  Bytes file = previewtest::buildDrawing(
+      {previewtest::headerData(), {kPng, Bytes(64, 2)}, {kBitmap, Bytes(64, 3)}, {kMetafile, Bytes(64, 4)}});
+  const size_t table = previewtest::kDirectoryAddress + 21;
+  previewtest::set32(file, table + 9 + 5, uint32_t(file.size()));            // PNG: size beyond the file
+  previewtest::set32(file, table + 18 + 1, 0xFFFFFFF0);                      // bitmap: start + size wraps
+  previewtest::set32(file, table + 27 + 1, uint32_t(file.size() - 63));      // metafile: one byte short
+  const auto directory = directoryOf(file);
+  ASSERT_TRUE(directory);
+  ASSERT_EQ(directory->entries.size(), 1u);
+  EXPECT_EQ(directory->entries[0].code, kHeaderData);
+  EXPECT_TRUE(picturesByPreference(*directory).empty());
+}
+
+TEST(PreviewDirectory, PreferencePngThenLargestBitmapThenMetafile) {
+  const Bytes file = previewtest::buildDrawing({previewtest::headerData(),
+                                                {kMetafile, Bytes(500, 0)},
+                                                {kBitmap, Bytes(100, 0)},
+                                                {9, Bytes(900, 0)},
+                                                {kBitmap, Bytes(300, 0)},
+                                                {kPng, Bytes(50, 0)},
+                                                {kBitmap, Bytes(0, 0)}});
+  const auto pictures = picturesOf(file);
+  ASSERT_EQ(pictures.size(), 4u) << "header data, unknown codes and empty entries are no pictures";
+  EXPECT_EQ(pictures[0].code, kPng);
+  EXPECT_EQ(pictures[1].code, kBitmap);
+  EXPECT_EQ(pictures[1].size, 300u);
+  EXPECT_EQ(pictures[2].size, 100u);
+  EXPECT_EQ(pictures[3].code, kMetafile);
+}
+
+TEST(PreviewDirectory, OversizedPictureIsNeitherChosenNorRead) {
+  // The entry claims more than any preview may hold; the source claims to be that large.
+  class HugeSource final : public PreviewSource {
+  public:
+    explicit HugeSource(const Bytes &head) : m_head(head) {}
+    uint64_t size() const override { return 1ull << 32; }
+    bool read(uint64_t offset, void *into, size_t count) override {
+      if (offset + count > m_head.size())
+        return false;
+      std::memcpy(into, m_head.data() + offset, count);
+      return true;
+    }
+
+  private:
+    Bytes m_head;
+  };
+  Bytes file = previewtest::buildDrawing({previewtest::headerData(), {kBitmap, Bytes(16, 0)}});
+  previewtest::set32(file, previewtest::kDirectoryAddress + 21 + 9 + 5, kMaxPictureBytes + 1);
+  HugeSource source(file);
+  const auto directory = readPreviewDirectory(source);
+  ASSERT_TRUE(directory);
+  ASSERT_EQ(directory->entries.size(), 2u);
+  EXPECT_TRUE(picturesByPreference(*directory).empty());
+  Bytes bytes;
+  EXPECT_FALSE(readEntryBytes(source, directory->entries[1], bytes));
+  EXPECT_TRUE(bytes.empty());
+}

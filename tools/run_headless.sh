@@ -1,0 +1,45 @@
+#!/usr/bin/env bash
+# Runs the development host on a display nobody looks at (Xvfb): evaluates the browse call,
+# saves a screenshot of what a person would see, closes the host with real X input and prints
+# the command line (the LISP result included).
+# Usage: run_headless.sh DEVHOST_EXE LISP_CALL SCREENSHOT_DIR
+set -euo pipefail
+exe=$1
+call=$2
+shots=$3
+mkdir -p "$shots"
+out=$(mktemp)
+trap 'rm -f "$out"' EXIT
+
+wine "$exe" --eval "$call" >"$out" 2>&1 &
+host=$!
+
+window=""
+for _ in $(seq 100); do
+  window=$(xdotool search --name '^Lumvex development host$' 2>/dev/null | head -n 1 || true)
+  [ -n "$window" ] && break
+  sleep 0.2
+done
+if [ -z "$window" ]; then
+  echo "lumvex: the development host did not open a window" >&2
+  kill "$host" 2>/dev/null || true
+  cat "$out"
+  exit 1
+fi
+sleep 1
+shot="$shots/devhost-$(date +%Y%m%d-%H%M%S).png"
+import -window root "$shot"
+echo "screenshot: $shot"
+
+xdotool windowactivate --sync "$window" 2>/dev/null || xdotool windowfocus "$window"
+xdotool key --clearmodifiers alt+F4
+for _ in $(seq 50); do
+  kill -0 "$host" 2>/dev/null || break
+  sleep 0.2
+done
+if kill -0 "$host" 2>/dev/null; then
+  echo "lumvex: the host did not close on Alt+F4" >&2
+  kill "$host"
+fi
+wait "$host" || true
+cat "$out"
