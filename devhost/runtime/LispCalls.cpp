@@ -24,7 +24,8 @@ bool Invoke(int code, resbuf *args) {
   devhost::ReleaseNodes(state.callArgs);
   state.callArgs = args;
   state.callCode = code;
-  SetResult(RTNONE, nullptr);
+  // A function that sets no result of its own gives LISP nil, as in the CAD application.
+  SetResult(RTNIL, nullptr);
   if (state.entryPoint) state.entryPoint(kInvkSubrMsg, state.module);
   devhost::ReleaseNodes(state.callArgs);
   state.callArgs = nullptr;

@@ -48,8 +48,8 @@ int devhostLoadModule(const wchar_t *path) {
 
 void devhostUnloadModule() {
   devhost::HostState &state = State();
-  if (!state.module) return;
   while (!state.drawings.empty()) devhostCloseDrawing(static_cast<int>(state.drawings.size()) - 1);
+  if (!state.module) return;
   Send(kUnloadAppMsg);
   FreeLibrary(state.module);
   state.module = nullptr;

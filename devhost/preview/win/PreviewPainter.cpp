@@ -1,0 +1,206 @@
+// acdbDisplayPreviewFromDwg: paints a drawing's stored preview into a window, scaled to fit with
+// its aspect ratio kept and centred on the background colour.
+#include "host/HostApi.h"
+#include "preview/PreviewCache.h"
+#include "preview/PreviewFit.h"
+#include "preview/PreviewTestApi.h"
+#include "preview/win/PreviewFile.h"
+#include "preview/win/PreviewImage.h"
+#include "preview/win/PreviewLoader.h"
+
+#include <windows.h>
+
+#include <memory>
+#include <string>
+#include <vector>
+
+using namespace devhost::preview;
+
+namespace {
+
+// A thumbnail view shows a few dozen tiles; this keeps a few screens of them.
+constexpr size_t kCacheEntries = 64;
+constexpr size_t kCacheBytes = 32u << 20;
+
+unsigned long g_decodeCount = 0;
+
+PreviewCache<PreviewImage> &previewCache() {
+  static PreviewCache<PreviewImage> cache(kCacheEntries, kCacheBytes);
+  return cache;
+}
+
+class WindowDc {
+public:
+  explicit WindowDc(HWND window) : m_window(window), m_dc(GetDC(window)) {}
+  ~WindowDc() {
+    if (m_dc)
+      ReleaseDC(m_window, m_dc);
+  }
+  WindowDc(const WindowDc &) = delete;
+  WindowDc &operator=(const WindowDc &) = delete;
+  HDC get() const { return m_dc; }
+
+private:
+  HWND m_window;
+  HDC m_dc;
+};
+
+// The painter changes clipping and the stretch mode; a window with its own DC keeps them.
+class SavedDcState {
+public:
+  explicit SavedDcState(HDC dc) : m_dc(dc), m_saved(SaveDC(dc)) {}
+  ~SavedDcState() {
+    if (m_saved)
+      RestoreDC(m_dc, m_saved);
+  }
+  SavedDcState(const SavedDcState &) = delete;
+  SavedDcState &operator=(const SavedDcState &) = delete;
+
+private:
+  HDC m_dc;
+  int m_saved;
+};
+
+class SolidBrush {
+public:
+  explicit SolidBrush(COLORREF colour) : m_brush(CreateSolidBrush(colour)) {}
+  ~SolidBrush() {
+    if (m_brush)
+      DeleteObject(m_brush);
+  }
+  SolidBrush(const SolidBrush &) = delete;
+  SolidBrush &operator=(const SolidBrush &) = delete;
+  HBRUSH get() const { return m_brush; }
+
+private:
+  HBRUSH m_brush;
+};
+
+// The cache key of the drawing: its full path (tiles pass names relative to the current folder),
+// size and last-write time. False when the file is not there.
+bool keyOf(const wchar_t *path, PreviewKey &key) {
+  const DWORD length = GetFullPathNameW(path, 0, nullptr, nullptr);
+  if (length == 0)
+    return false;
+  std::wstring full(length, L'\0');
+  const DWORD written = GetFullPathNameW(path, length, &full[0], nullptr);
+  if (written == 0 || written >= length)
+    return false;
+  full.resize(written);
+  WIN32_FILE_ATTRIBUTE_DATA attributes;
+  if (!GetFileAttributesExW(full.c_str(), GetFileExInfoStandard, &attributes) ||
+      (attributes.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY))
+    return false;
+  key.path = std::move(full);
+  key.size = uint64_t(attributes.nFileSizeHigh) << 32 | attributes.nFileSizeLow;
+  key.lastWrite = uint64_t(attributes.ftLastWriteTime.dwHighDateTime) << 32 | attributes.ftLastWriteTime.dwLowDateTime;
+  return true;
+}
+
+std::shared_ptr<const PreviewImage> previewOf(const wchar_t *path) {
+  PreviewKey key;
+  if (path == nullptr || !keyOf(path, key))
+    return nullptr;
+  if (auto kept = previewCache().find(key))
+    return kept;
+  ++g_decodeCount;
+  auto image = std::make_shared<PreviewImage>();
+  if (auto file = PreviewFile::open(key.path.c_str()))
+    *image = loadPreviewImage(*file);
+  // Drawings without a picture are kept too: repainting them must not read the file again.
+  previewCache().store(key, image);
+  return image;
+}
+
+// A picture with transparency is blended over the background here, since StretchDIBits copies.
+std::vector<uint32_t> blendOver(const DecodedPicture &picture, COLORREF background) {
+  const uint32_t backRed = GetRValue(background), backGreen = GetGValue(background),
+                 backBlue = GetBValue(background);
+  std::vector<uint32_t> blended(picture.pixels.size());
+  for (size_t i = 0; i < blended.size(); ++i) {
+    const uint32_t pixel = picture.pixels[i];
+    const uint32_t alpha = pixel >> 24;
+    auto mix = [alpha](uint32_t front, uint32_t back) { return (front * alpha + back * (255 - alpha) + 127) / 255; };
+    blended[i] = 0xFF000000u | mix((pixel >> 16) & 0xFF, backRed) << 16 | mix((pixel >> 8) & 0xFF, backGreen) << 8 |
+                 mix(pixel & 0xFF, backBlue);
+  }
+  return blended;
+}
+
+void paintRaster(HDC dc, const FitRect &fit, const DecodedPicture &picture, COLORREF background) {
+  std::vector<uint32_t> blended;
+  const uint32_t *pixels = picture.pixels.data();
+  if (picture.hasAlpha) {
+    blended = blendOver(picture, background);
+    pixels = blended.data();
+  }
+  BITMAPINFO info = {};
+  info.bmiHeader.biSize = sizeof info.bmiHeader;
+  info.bmiHeader.biWidth = LONG(picture.width);
+  info.bmiHeader.biHeight = -LONG(picture.height); // top row first
+  info.bmiHeader.biPlanes = 1;
+  info.bmiHeader.biBitCount = 32;
+  info.bmiHeader.biCompression = BI_RGB;
+  SetStretchBltMode(dc, HALFTONE);
+  SetBrushOrgEx(dc, 0, 0, nullptr);
+  StretchDIBits(dc, fit.left, fit.top, fit.width, fit.height, 0, 0, int(picture.width), int(picture.height), pixels,
+                &info, DIB_RGB_COLORS, SRCCOPY);
+}
+
+void paint(HDC dc, const RECT &client, COLORREF background, const PreviewImage *image) {
+  SavedDcState saved(dc);
+  SolidBrush brush(background);
+  const int32_t width = client.right - client.left, height = client.bottom - client.top;
+  if (image == nullptr || !image->hasPicture()) {
+    FillRect(dc, &client, brush.get());
+    return;
+  }
+  FitRect fit;
+  if (image->aspectWidth != 0)
+    fit = fitCentred(image->aspectWidth, image->aspectHeight, width, height);
+  else
+    fit = FitRect{0, 0, width, height};
+  fit.left += client.left;
+  fit.top += client.top;
+  const RECT picture = {fit.left, fit.top, fit.left + fit.width, fit.top + fit.height};
+
+  // The margins are filled around the picture rather than under it, so a repaint does not flash.
+  ExcludeClipRect(dc, picture.left, picture.top, picture.right, picture.bottom);
+  FillRect(dc, &client, brush.get());
+  SelectClipRgn(dc, nullptr);
+  if (image->metafile.get()) {
+    // A metafile draws only its strokes: its own background comes first.
+    FillRect(dc, &picture, brush.get());
+    PlayEnhMetaFile(dc, image->metafile.get(), &picture);
+  } else {
+    paintRaster(dc, fit, image->raster, background);
+  }
+}
+
+} // namespace
+
+extern "C" bool acdbDisplayPreviewFromDwg(const ACHAR *path, void *window, const uint32_t *background) {
+  try {
+    const HWND target = static_cast<HWND>(window);
+    if (target == nullptr || !IsWindow(target))
+      return false;
+    // Only the colour: the top byte of a COLORREF would select palette colours instead.
+    const COLORREF colour = background ? COLORREF(*background & 0x00FFFFFF) : RGB(0, 0, 0);
+    const auto image = previewOf(path);
+    WindowDc dc(target);
+    if (dc.get() == nullptr)
+      return false;
+    RECT client;
+    GetClientRect(target, &client);
+    paint(dc.get(), client, colour, image.get());
+    return image && image->hasPicture();
+  } catch (...) {
+    return false; // out of memory: nothing painted, nothing thrown into the caller's paint handler
+  }
+}
+
+extern "C" unsigned long devhostPreviewDecodeCount() { return g_decodeCount; }
+
+extern "C" unsigned long long devhostPreviewBytesRead() { return PreviewFile::totalBytesRead(); }
+
+extern "C" void devhostPreviewClearCache() { previewCache().clear(); }

@@ -1,0 +1,76 @@
+#!/usr/bin/env bash
+# devhost.exe --batch driven as a script would drive it: exact standard output, alerts on
+# standard error, exit codes, and the same behaviour through ./lumvex devhost.
+# Usage: batch_test.sh BIN_DIR REPO_ROOT
+set -uo pipefail
+bin=$1
+root=$2
+run="$root/cmake/wine-run"
+passed=0
+failed=0
+work=$(mktemp -d)
+trap 'rm -rf "$work"' EXIT
+
+host() { "$run" "$bin/devhost.exe" "$@" >"$work/out" 2>"$work/err"; echo $? >"$work/rc"; }
+alerts() { grep '^alert: ' "$work/err" || true; }
+
+check() {  # check NAME EXPECTED ACTUAL
+  if [ "$2" == "$3" ]; then
+    passed=$((passed + 1))
+  else
+    failed=$((failed + 1))
+    printf 'FAILED %s\n--- expected\n%s\n--- actual\n%s\n' "$1" "$2" "$3"
+  fi
+}
+
+host --batch --eval '(Lumvex 0)'
+check "missing arguments: stdout" $'\nMissing parametrs\n.' "$(cat "$work/out"; echo .)"
+check "missing arguments: alert" 'alert: \nMissing parametrs\n' "$(alerts)"
+check "missing arguments: exit code" 0 "$(cat "$work/rc")"
+
+host --batch --eval '(Lumvex 0 0 1 "" "")'
+check "wrong type: stdout" $'\nArgument should be an short' "$(cat "$work/out")"
+check "wrong type: alert" 'alert: \nArgument should be an short' "$(alerts)"
+
+host --batch --eval '(Lumvex 0 0 "" "" "")' --eval '(Lumvex 0 0 "" "" "" 7)'
+check "well-typed calls give nil" $'nil\nnil\n.' "$(cat "$work/out"; echo .)"
+check "well-typed calls alert nothing" "" "$(alerts)"
+
+host --batch --eval '(setq x (list 1 2.5 "a\\b" (list "c")))' --eval '(cadr x)'
+check "setq and cadr" $'(1 2.5 "a\\\\b" ("c"))\n2.5' "$(cat "$work/out")"
+
+host --batch --eval '(car (list 1' --eval '(foo 1)' --eval '"still here"'
+check "errors are reported and evaluation goes on" \
+  $'; error: malformed list on input\n; error: no function definition: FOO\n"still here"' "$(cat "$work/out")"
+check "errors do not change the exit code" 0 "$(cat "$work/rc")"
+
+host --batch --eval '(princ "abc")' --eval '(Lumvex 0 0 "" "" "")'
+check "printed text then results on their own lines" $'abc\n"abc"\nnil' "$(cat "$work/out")"
+
+host --batch --drawings 0 --eval '(Lumvex 0 0 "" "" "")'
+check "no drawing, no function" '; error: no function definition: LUMVEX' "$(cat "$work/out")"
+
+host --batch --drawings 2 --eval '(Lumvex 0 0 "C:\\Proj\\plan.dwg" "Insert" "Close")'
+check "two drawings" 'nil' "$(cat "$work/out")"
+
+host --batch --module 'C:\no\such\module.arx' --eval '(Lumvex 0)'
+check "missing module: exit code" 2 "$(cat "$work/rc")"
+check "missing module: nothing evaluated" "" "$(cat "$work/out")"
+
+host --batch --module "$bin/devhostrt.dll" --eval '(Lumvex 0)'
+check "a DLL that is no module is refused" 2 "$(cat "$work/rc")"
+
+host --batch --frobnicate
+check "unknown option" 64 "$(cat "$work/rc")"
+
+host --batch --eval '(Lumvex 0 0 1 "" "")' --eval '(list "x" (Lumvex 0 0 "" "" ""))'
+direct_out=$(cat "$work/out")
+direct_alerts=$(alerts)
+"$root/lumvex" devhost --batch --eval '(Lumvex 0 0 1 "" "")' --eval '(list "x" (Lumvex 0 0 "" "" ""))' >"$work/out" 2>"$work/err"
+check "./lumvex devhost: same stdout" "$direct_out" "$(cat "$work/out")"
+check "./lumvex devhost: same alerts" "$direct_alerts" "$(alerts)"
+"$root/lumvex" devhost --batch --module 'C:\nothing.arx' >/dev/null 2>&1
+check "./lumvex devhost: exit code passed through" 2 "$?"
+
+echo "e2e: $passed passed, $failed failed"
+[ "$failed" -eq 0 ]
