@@ -41,15 +41,17 @@ Value Evaluator::EvalCall(const Value& form, int depth) {
   if (head.kind != Value::Kind::Sym) throw Error("bad function: " + ToUtf8(Prin1(head)));
   const std::wstring& name = head.text;
   if (name == L"QUOTE") {
-    const std::vector<Value> quoted(form.items.begin() + 1, form.items.end());
-    RequireCount(quoted, 1, 1);
-    return quoted.front();
+    if (form.items.size() < 2) throw Error("too few arguments");
+    if (form.items.size() > 2) throw Error("too many arguments");
+    return form.items[1];
   }
   if (name == L"SETQ") return Setq(form.items, depth);
 
   std::vector<Value> args;
   args.reserve(form.items.size() - 1);
-  for (size_t i = 1; i < form.items.size(); ++i) args.push_back(Received(EvalAt(form.items[i], depth)));
+  for (size_t i = 1; i < form.items.size(); ++i) {
+    args.push_back(Received(EvalAt(form.items[i], depth)));
+  }
   if (const Builtin builtin = FindBuiltin(name)) return builtin(BuiltinCall{name, args, m_output});
   return CallExternal(name, args);
 }

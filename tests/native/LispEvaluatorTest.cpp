@@ -32,6 +32,15 @@ protected:
     return lisp::Prin1(result);
   }
 
+  std::wstring WideFailure(const std::wstring& source) {
+    try {
+      Run(source);
+    } catch (const lisp::Error& error) {
+      return lisp::WideMessage(error);
+    }
+    return L"(no error)";
+  }
+
   std::string Fails(const std::wstring& source) {
     try {
       Run(source);
@@ -157,6 +166,14 @@ TEST_F(LispEvaluator, ExternalFunctionsGetTheUpperCasedNameAndEvaluatedArguments
   lisp::Evaluator withoutModule(nullptr, nullptr);
   EXPECT_THROW(withoutModule.Eval(lisp::ReadAll(L"(lumvex)").front()), lisp::Error);
   EXPECT_EQ(withoutModule.Eval(lisp::ReadAll(L"(princ 1)").front()), Value::Int(1));
+}
+
+// Messages are UTF-8 inside lisp::Error; names and printed values beyond ASCII, and characters
+// beyond 16 bits, come back intact as wide text.
+TEST_F(LispEvaluator, ErrorMessagesKeepWideText) {
+  EXPECT_EQ(WideFailure(L"(caf\u00e9 1)"), L"no function definition: CAF\u00c9");
+  EXPECT_EQ(WideFailure(L"(strcat \"a\" 'caf\u00e9)"), L"bad argument type: stringp CAF\u00c9");
+  EXPECT_EQ(WideFailure(L"(\"\U0001F600\u4e2d\")"), L"bad function: \"\U0001F600\u4e2d\"");
 }
 
 TEST_F(LispEvaluator, BadFunctions) {

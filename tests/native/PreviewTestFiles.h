@@ -141,14 +141,17 @@ inline void putPngChunk(Bytes &png, const char *type, const Bytes &data) {
   putBe32(png, crc32(png.data() + typeAt, png.size() - typeAt));
 }
 
-// An 8-bit RGB PNG of colour(x, y) (0x00RRGGBB).
-inline Bytes buildPng(uint32_t width, uint32_t height, const std::function<uint32_t(int, int)> &colour) {
+// An 8-bit PNG of colour(x, y): RGB from 0x00RRGGBB, or with alpha RGBA from 0xAARRGGBB.
+inline Bytes buildPng(uint32_t width, uint32_t height, const std::function<uint32_t(int, int)> &colour,
+                      bool alpha = false) {
   Bytes raw;
   for (uint32_t y = 0; y < height; ++y) {
     raw.push_back(0); // filter: none
     for (uint32_t x = 0; x < width; ++x) {
       const uint32_t c = colour(int(x), int(y));
       raw.push_back(uint8_t(c >> 16)), raw.push_back(uint8_t(c >> 8)), raw.push_back(uint8_t(c));
+      if (alpha)
+        raw.push_back(uint8_t(c >> 24));
     }
   }
   Bytes z = {0x78, 0x01};
@@ -168,7 +171,7 @@ inline Bytes buildPng(uint32_t width, uint32_t height, const std::function<uint3
   Bytes header;
   putBe32(header, width);
   putBe32(header, height);
-  header.insert(header.end(), {8, 2, 0, 0, 0});
+  header.insert(header.end(), {8, uint8_t(alpha ? 6 : 2), 0, 0, 0});
   putPngChunk(png, "IHDR", header);
   putPngChunk(png, "IDAT", z);
   putPngChunk(png, "IEND", {});

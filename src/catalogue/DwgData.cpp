@@ -1,0 +1,7 @@
+#include "catalogue/DwgData.h"
+
+namespace {
+DwgCatalogue theCatalogue;
+}
+
+DwgCatalogue *const g_pCatalogue = &theCatalogue;
