@@ -17,7 +17,8 @@ class LispEvaluator : public ::testing::Test {
 protected:
   LispEvaluator()
       : m_evaluator(
-            [this](const std::wstring& name, const std::vector<Value>& args) -> std::optional<Value> {
+            [this](const std::wstring& name,
+                   const std::vector<Value>& args) -> std::optional<Value> {
               calls.push_back(Value::List({Value::Sym(name), Value::List(args)}));
               if (name == L"LUMVEX") return Value::List({Value::Str(L"picked"), Value::List(args)});
               if (name == L"QUIET") return Value::Void();
@@ -90,7 +91,8 @@ TEST_F(LispEvaluator, ListFunctions) {
   EXPECT_EQ(Run(L"(nth 1 '(a b))"), L"B");
   EXPECT_EQ(Run(L"(nth 2 '(a b))"), L"nil");
   EXPECT_EQ(Run(L"(nth -1 '(a b))"), L"nil");
-  EXPECT_EQ(Run(L"(list (atom 1) (atom nil) (atom '(1)) (listp nil) (listp 1))"), L"(T T nil T nil)");
+  EXPECT_EQ(Run(L"(list (atom 1) (atom nil) (atom '(1)) (listp nil) (listp 1))"),
+            L"(T T nil T nil)");
   EXPECT_EQ(Run(L"(list (not nil) (null 0) (equal '(1 \"a\") (list 1 \"a\")))"), L"(T nil T)");
   EXPECT_EQ(Fails(L"(car \"a\")"), "bad argument type: consp \"a\"");
   EXPECT_EQ(Fails(L"(length 5)"), "bad argument type: listp 5");
@@ -121,7 +123,8 @@ TEST_F(LispEvaluator, Arithmetic) {
 }
 
 TEST_F(LispEvaluator, Comparisons) {
-  EXPECT_EQ(Run(L"(list (= 1 1.0) (= 1 2) (= \"a\" \"a\") (= \"a\" 1) (/= 1 2))"), L"(T nil T nil T)");
+  EXPECT_EQ(Run(L"(list (= 1 1.0) (= 1 2) (= \"a\" \"a\") (= \"a\" 1) (/= 1 2))"),
+            L"(T nil T nil T)");
   EXPECT_EQ(Run(L"(list (< 1 2 3) (< 1 3 2) (> 2.5 2) (<= 2 2) (>= 1 2) (< \"a\" \"b\"))"),
             L"(T nil T T nil T)");
   EXPECT_EQ(Fails(L"(< 1 \"a\")"), "bad argument type: numberp: \"a\"");

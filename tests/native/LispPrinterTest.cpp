@@ -85,6 +85,7 @@ TEST(LispPrinter, ReadingWhatPrin1WroteGivesTheValueBack) {
   };
   for (const Value& value : values) {
     const std::wstring text = lisp::Prin1(value);
-    EXPECT_EQ(lisp::ReadAll(text), std::vector<Value>{value}) << std::string(text.begin(), text.end());
+    EXPECT_EQ(lisp::ReadAll(text), std::vector<Value>{value})
+        << std::string(text.begin(), text.end());
   }
 }

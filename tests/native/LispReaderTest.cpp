@@ -87,7 +87,8 @@ TEST(LispReader, StringEscapes) {
 
 TEST(LispReader, ListsQuotesAndComments) {
   EXPECT_EQ(ReadOne(L"(1 (2 \"x\") nil)"),
-            Value::List({Value::Int(1), Value::List({Value::Int(2), Value::Str(L"x")}), Value::Nil()}));
+            Value::List({Value::Int(1), Value::List({Value::Int(2), Value::Str(L"x")}),
+                         Value::Nil()}));
   EXPECT_EQ(ReadOne(L"'x"), Value::List({Sym(L"QUOTE"), Sym(L"X")}));
   EXPECT_EQ(ReadOne(L"''x"),
             Value::List({Sym(L"QUOTE"), Value::List({Sym(L"QUOTE"), Sym(L"X")})}));

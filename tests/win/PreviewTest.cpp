@@ -63,7 +63,8 @@ private:
   std::vector<std::wstring> m_files;
 };
 
-// A top-level window whose WM_PAINT asks the host for a preview, as a tile does.
+// A bordered child window whose WM_PAINT asks the host for a preview, as a tile does, inside
+// a top-most frame of its own so that no other window hides it.
 class PreviewWindow {
 public:
   PreviewWindow(int width, int height) {
@@ -72,15 +73,19 @@ public:
       wc.lpfnWndProc = &PreviewWindow::procedure;
       wc.hInstance = GetModuleHandleW(nullptr);
       wc.lpszClassName = L"LumvexPreviewTest";
-      wc.hCursor = LoadCursor(nullptr, IDC_ARROW);
       return RegisterClassW(&wc); // no background brush: only the painter paints
     }();
-    m_window = CreateWindowExW(WS_EX_TOOLWINDOW, MAKEINTATOM(windowClass), L"", WS_POPUP | WS_VISIBLE, 20, 20, width,
-                               height, nullptr, nullptr, GetModuleHandleW(nullptr), this);
+    static int nextLeft = 0;
+    const int left = 10 + nextLeft % 800;
+    nextLeft += width + 40;
+    m_frame = CreateWindowExW(WS_EX_TOOLWINDOW | WS_EX_TOPMOST, reinterpret_cast<LPCWSTR>(uintptr_t(windowClass)), L"", WS_POPUP | WS_VISIBLE,
+                              left, 10, width + 20, height + 20, nullptr, nullptr, GetModuleHandleW(nullptr), nullptr);
+    m_window = CreateWindowExW(0, reinterpret_cast<LPCWSTR>(uintptr_t(windowClass)), L"", WS_CHILD | WS_VISIBLE | WS_BORDER, 10, 10, width + 2,
+                               height + 2, m_frame, nullptr, GetModuleHandleW(nullptr), nullptr);
     SetWindowLongPtrW(m_window, GWLP_USERDATA, LONG_PTR(this));
     pumpMessages();
   }
-  ~PreviewWindow() { DestroyWindow(m_window); }
+  ~PreviewWindow() { DestroyWindow(m_frame); }
   PreviewWindow(const PreviewWindow &) = delete;
   PreviewWindow &operator=(const PreviewWindow &) = delete;
 
@@ -154,6 +159,7 @@ private:
     return client;
   }
 
+  HWND m_frame = nullptr;
   HWND m_window = nullptr;
   std::wstring m_path;
   bool m_painted = false;

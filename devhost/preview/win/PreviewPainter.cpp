@@ -76,13 +76,14 @@ private:
   HBRUSH m_brush;
 };
 
-// The cache key of the drawing: its full path (tiles pass names relative to the current folder),
-// size and last-write time. False when the file is not there.
-bool keyOf(const wchar_t *path, PreviewKey &key) {
+// The cache key of the drawing: its full path (tiles pass names relative to the current folder)
+// in lower case, as file names are compared here, its size and its last-write time. False when
+// the file is not there.
+bool keyOf(const wchar_t *path, std::wstring &full, PreviewKey &key) {
   const DWORD length = GetFullPathNameW(path, 0, nullptr, nullptr);
   if (length == 0)
     return false;
-  std::wstring full(length, L'\0');
+  full.assign(length, L'\0');
   const DWORD written = GetFullPathNameW(path, length, &full[0], nullptr);
   if (written == 0 || written >= length)
     return false;
@@ -91,21 +92,23 @@ bool keyOf(const wchar_t *path, PreviewKey &key) {
   if (!GetFileAttributesExW(full.c_str(), GetFileExInfoStandard, &attributes) ||
       (attributes.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY))
     return false;
-  key.path = std::move(full);
+  key.path = full;
+  CharLowerBuffW(&key.path[0], DWORD(key.path.size()));
   key.size = uint64_t(attributes.nFileSizeHigh) << 32 | attributes.nFileSizeLow;
   key.lastWrite = uint64_t(attributes.ftLastWriteTime.dwHighDateTime) << 32 | attributes.ftLastWriteTime.dwLowDateTime;
   return true;
 }
 
 std::shared_ptr<const PreviewImage> previewOf(const wchar_t *path) {
+  std::wstring full;
   PreviewKey key;
-  if (path == nullptr || !keyOf(path, key))
+  if (path == nullptr || !keyOf(path, full, key))
     return nullptr;
   if (auto kept = previewCache().find(key))
     return kept;
   ++g_decodeCount;
   auto image = std::make_shared<PreviewImage>();
-  if (auto file = PreviewFile::open(key.path.c_str()))
+  if (auto file = PreviewFile::open(full.c_str()))
     *image = loadPreviewImage(*file);
   // Drawings without a picture are kept too: repainting them must not read the file again.
   previewCache().store(key, image);
