@@ -1,0 +1,183 @@
+// Costs of the drawing catalogue: scanning a large folder against a bare directory listing,
+// sorting a large catalogue by each key, and the memory one record takes.
+// Prints one figure a line: name value unit.
+#include "catalogue/DwgData.h"
+#include "catalogue/FolderScan.h"
+#include "catalogue/Ordering.h"
+
+#include <windows.h>
+
+#include <algorithm>
+#include <atomic>
+#include <cstdio>
+#include <cstdlib>
+#include <new>
+#include <random>
+#include <string>
+#include <vector>
+
+// Live heap bytes handed out by operator new: the catalogue's array and its names' text both
+// come from it. Counts the sizes asked for, not the C heap's own bookkeeping per block.
+namespace {
+std::atomic<long long> g_liveBytes{0};
+const std::size_t kHeader = 16;  // keeps the caller's block 16-byte aligned
+
+void *CountedAllocate(std::size_t size) {
+  void *block = std::malloc(size + kHeader);
+  if (!block) throw std::bad_alloc();
+  *static_cast<std::size_t *>(block) = size;
+  g_liveBytes += static_cast<long long>(size);
+  return static_cast<char *>(block) + kHeader;
+}
+
+void CountedFree(void *pointer) {
+  if (!pointer) return;
+  void *block = static_cast<char *>(pointer) - kHeader;
+  g_liveBytes -= static_cast<long long>(*static_cast<std::size_t *>(block));
+  std::free(block);
+}
+}  // namespace
+
+void *operator new(std::size_t size) { return CountedAllocate(size); }
+void *operator new[](std::size_t size) { return CountedAllocate(size); }
+void operator delete(void *pointer) noexcept { CountedFree(pointer); }
+void operator delete[](void *pointer) noexcept { CountedFree(pointer); }
+void operator delete(void *pointer, std::size_t) noexcept { CountedFree(pointer); }
+void operator delete[](void *pointer, std::size_t) noexcept { CountedFree(pointer); }
+
+namespace {
+const char kMixedFolder[] = "Z:\\tmp\\lumvex-bench-100k";        // 100,000 entries, 10% drawings
+const char kDrawingFolder[] = "Z:\\tmp\\lumvex-bench-100k-dwg";  // 100,000 drawings
+const int kEntries = 100000;
+const int kRounds = 3;
+
+double NowMs() {
+  static LARGE_INTEGER frequency = [] {
+    LARGE_INTEGER f;
+    QueryPerformanceFrequency(&f);
+    return f;
+  }();
+  LARGE_INTEGER now;
+  QueryPerformanceCounter(&now);
+  return 1000.0 * static_cast<double>(now.QuadPart) / static_cast<double>(frequency.QuadPart);
+}
+
+std::string DrawingName(int i, std::mt19937 &random) {
+  char name[64];
+  std::snprintf(name, sizeof name, i % 3 ? "plan-%05d-rev %c.dwg" : "Plan-%05d-Rev %c.DWG", i, 'a' + static_cast<int>(random() % 26));
+  return name;
+}
+
+bool Exists(const std::string &path) { return GetFileAttributesA(path.c_str()) != INVALID_FILE_ATTRIBUTES; }
+
+void CreateEmptyFile(const std::string &path) {
+  const HANDLE file = CreateFileA(path.c_str(), GENERIC_WRITE, 0, nullptr, CREATE_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
+  if (file != INVALID_HANDLE_VALUE) CloseHandle(file);
+}
+
+// Made once and kept between runs: the last name written tells that a folder is complete.
+void EnsureFolder(const char *folder, int drawingEvery) {
+  const std::string base = std::string(folder) + "\\";
+  std::vector<std::string> names;
+  std::mt19937 random(7);
+  const char *others[] = {"note-%05d.txt", "photo-%05d.jpg", "sheet-%05d.xlsx", "plan-%05d.pdf"};
+  for (int i = 0; i < kEntries; ++i) {
+    if (i % drawingEvery == 0) {
+      names.push_back(DrawingName(i, random));
+    } else {
+      char name[64];
+      std::snprintf(name, sizeof name, others[i % 4], i);
+      names.push_back(name);
+    }
+  }
+  if (Exists(base + names.back())) return;
+  std::fprintf(stderr, "creating %d entries in %s (once)\n", kEntries, folder);
+  CreateDirectoryA(folder, nullptr);
+  for (const std::string &name : names) CreateEmptyFile(base + name);
+}
+
+int PlainListing(const char *folder) {
+  WIN32_FIND_DATAA entry;
+  const HANDLE find = FindFirstFileA((std::string(folder) + "\\*").c_str(), &entry);
+  if (find == INVALID_HANDLE_VALUE) return 0;
+  int count = 0;
+  do ++count;
+  while (FindNextFileA(find, &entry));
+  FindClose(find);
+  return count;
+}
+
+void BenchScan() {
+  EnsureFolder(kMixedFolder, 10);
+  PlainListing(kMixedFolder);
+  ScanFolder(kMixedFolder, ".dwg");
+
+  double bestPlain = 1e300, bestScan = 1e300;
+  int listed = 0, taken = 0;
+  for (int round = 0; round < kRounds; ++round) {
+    double start = NowMs();
+    listed = PlainListing(kMixedFolder);
+    bestPlain = std::min(bestPlain, NowMs() - start);
+    start = NowMs();
+    ScanFolder(kMixedFolder, ".dwg");
+    bestScan = std::min(bestScan, NowMs() - start);
+    taken = g_pCatalogue->GetSize();
+  }
+  std::fprintf(stderr, "listed %d entries, %d drawings taken\n", listed, taken);
+  std::printf("scan_100k_ms %.1f ms\n", bestScan);
+  std::printf("plain_loop_100k_ms %.1f ms\n", bestPlain);
+  std::printf("scan_ratio_100k %.2f x\n", bestScan / bestPlain);
+  EmptyCatalogue();
+}
+
+void BenchMemory() {
+  EnsureFolder(kDrawingFolder, 1);
+  EmptyCatalogue();
+  const long long before = g_liveBytes;
+  const double start = NowMs();
+  ScanFolder(kDrawingFolder, ".dwg");
+  const double scanMs = NowMs() - start;
+  const long long bytes = g_liveBytes - before;
+  const int count = g_pCatalogue->GetSize();
+  std::printf("scan_100k_drawings_ms %.1f ms\n", scanMs);
+  std::printf("catalogue_bytes_per_record %.1f bytes\n", count ? static_cast<double>(bytes) / count : 0.0);
+  std::fprintf(stderr, "%d records, %lld bytes live, sizeof(DwgData) %zu\n", count, bytes, sizeof(DwgData));
+  EmptyCatalogue();
+}
+
+void BenchSort() {
+  std::mt19937 random(42);
+  DwgCatalogue shuffled;
+  shuffled.SetSize(0, kEntries);
+  std::vector<int> numbers(kEntries);
+  for (int i = 0; i < kEntries; ++i) numbers[i] = i;
+  std::shuffle(numbers.begin(), numbers.end(), random);
+  for (int number : numbers) {
+    std::string name = DrawingName(number, random);
+    std::transform(name.begin(), name.end(), name.begin(), [](char c) { return c >= 'A' && c <= 'Z' ? char(c + 32) : c; });
+    shuffled.Add(DwgData(name, 1500000000 + static_cast<int64_t>(random() % 300000000), random() % 5000000));
+  }
+
+  const struct {
+    const char *figure;
+    int key;
+  } keys[] = {{"sort_name_100k_ms", kSortByName}, {"sort_date_100k_ms", kSortByDate}, {"sort_size_100k_ms", kSortBySize}};
+  for (const auto &key : keys) {
+    double best = 1e300;
+    for (int round = 0; round < kRounds; ++round) {
+      DwgCatalogue catalogue = shuffled;
+      const double start = NowMs();
+      SortRecords(catalogue, key.key);
+      best = std::min(best, NowMs() - start);
+    }
+    std::printf("%s %.1f ms\n", key.figure, best);
+  }
+}
+}  // namespace
+
+int main() {
+  BenchScan();
+  BenchSort();
+  BenchMemory();
+  return 0;
+}

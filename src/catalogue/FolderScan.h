@@ -1,0 +1,13 @@
+// Filling the catalogue from a folder of the file system.
+#pragma once
+
+#include <string>
+
+// Empties the catalogue and sets its growth step to 100 records, as every scan begins.
+void EmptyCatalogue();
+
+// The listing half of the folder tree's LoadFolder: empties the catalogue, makes `path` the
+// document's shown folder (when a document exists) and the process's current directory, then
+// adds one record for every entry of the folder that the scan's filter takes, in listing order,
+// every record unmarked. False when the folder cannot be listed; the catalogue is then empty.
+bool ScanFolder(const std::string &path, const char *extension);

@@ -1,0 +1,35 @@
+// The document of one browse call: the folder shown, the drawing chosen or found last, the
+// folder-tree path, and the explorer's sizes and sort key, which live in the explorer state
+// file beside the module from one call to the next.
+#pragma once
+
+#include "fw/Document.h"
+#include "settings/IniFile.h"
+
+#include <string>
+
+class COmbra3Doc : public fw::CDocument {
+public:
+  // Reads the state file; sets g_pDoc.
+  COmbra3Doc();
+  // Writes every value back to the state file; clears g_pDoc.
+  ~COmbra3Doc() override;
+
+  std::string m_strPath;
+  std::string m_strName;
+  std::string m_strShellPath;
+  int m_nSplitterSize = 0;
+  int m_nWindowWidth = 0;
+  int m_nWindowHeight = 0;
+  int m_nPictureWidth = 0;
+  int m_nPictureHeight = 0;
+  int m_nSort = 0;
+  CIniFile m_iniFile;
+
+private:
+  void LoadState();
+  void SaveState();
+};
+
+// The document of the running browse call, or null between calls.
+extern COmbra3Doc *g_pDoc;

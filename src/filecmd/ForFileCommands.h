@@ -1,0 +1,19 @@
+// Reading the clipboard's file list, paste into the shown folder, and rename: stateless, made
+// on the stack around each use.
+#pragma once
+
+#include <windows.h>
+
+class ForFileCommands {
+public:
+  virtual ~ForFileCommands() = default;
+
+  // True when the clipboard offers a file list holding at least one drawing.
+  bool CanPaste();
+  // Copies every file of the clipboard's list into the current directory through the shell;
+  // true when the shell reports success.
+  bool Paste();
+  // Renames through the shell and returns its result, 0 for success. The owner is not used.
+  int RenameFile(const char *from, const char *to, HWND owner);
+  static bool IsDwgPath(const char *path);
+};
