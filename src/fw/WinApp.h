@@ -5,6 +5,8 @@
 
 namespace fw {
 
+class CWnd;
+
 class CWinApp {
 public:
   CWinApp();
@@ -16,6 +18,8 @@ public:
   virtual int ExitInstance() { return 0; }
 
   HINSTANCE m_hInstance = nullptr;
+  // The window that posted application messages go to (the modal dialog while it runs).
+  CWnd *m_pMainWnd = nullptr;
 };
 
 CWinApp *AfxGetApp();
