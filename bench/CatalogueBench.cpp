@@ -64,36 +64,17 @@ double NowMs() {
 
 std::string DrawingName(int i, std::mt19937 &random) {
   char name[64];
-  std::snprintf(name, sizeof name, i % 3 ? "plan-%05d-rev %c.dwg" : "Plan-%05d-Rev %c.DWG", i, 'a' + static_cast<int>(random() % 26));
+  std::snprintf(name, sizeof name, "plan-%05d-rev %c.dwg", i, 'a' + static_cast<int>(random() % 26));
   return name;
 }
 
 bool Exists(const std::string &path) { return GetFileAttributesA(path.c_str()) != INVALID_FILE_ATTRIBUTES; }
 
-void CreateEmptyFile(const std::string &path) {
-  const HANDLE file = CreateFileA(path.c_str(), GENERIC_WRITE, 0, nullptr, CREATE_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
-  if (file != INVALID_HANDLE_VALUE) CloseHandle(file);
-}
-
-// Made once and kept between runs: the last name written tells that a folder is complete.
-void EnsureFolder(const char *folder, int drawingEvery) {
-  const std::string base = std::string(folder) + "\\";
-  std::vector<std::string> names;
-  std::mt19937 random(7);
-  const char *others[] = {"note-%05d.txt", "photo-%05d.jpg", "sheet-%05d.xlsx", "plan-%05d.pdf"};
-  for (int i = 0; i < kEntries; ++i) {
-    if (i % drawingEvery == 0) {
-      names.push_back(DrawingName(i, random));
-    } else {
-      char name[64];
-      std::snprintf(name, sizeof name, others[i % 4], i);
-      names.push_back(name);
-    }
-  }
-  if (Exists(base + names.back())) return;
-  std::fprintf(stderr, "creating %d entries in %s (once)\n", kEntries, folder);
-  CreateDirectoryA(folder, nullptr);
-  for (const std::string &name : names) CreateEmptyFile(base + name);
+// The folders are made natively by CatalogueBenchFolders.cmake: through Wine it takes too long.
+bool FolderReady(const char *folder) {
+  if (Exists(std::string(folder) + ".complete")) return true;
+  std::fprintf(stderr, "%s is missing: build the target catalogue_bench_folders first\n", folder);
+  return false;
 }
 
 int PlainListing(const char *folder) {
@@ -108,7 +89,6 @@ int PlainListing(const char *folder) {
 }
 
 void BenchScan() {
-  EnsureFolder(kMixedFolder, 10);
   PlainListing(kMixedFolder);
   ScanFolder(kMixedFolder, ".dwg");
 
@@ -131,7 +111,6 @@ void BenchScan() {
 }
 
 void BenchMemory() {
-  EnsureFolder(kDrawingFolder, 1);
   EmptyCatalogue();
   const long long before = g_liveBytes;
   const double start = NowMs();
@@ -153,9 +132,7 @@ void BenchSort() {
   for (int i = 0; i < kEntries; ++i) numbers[i] = i;
   std::shuffle(numbers.begin(), numbers.end(), random);
   for (int number : numbers) {
-    std::string name = DrawingName(number, random);
-    std::transform(name.begin(), name.end(), name.begin(), [](char c) { return c >= 'A' && c <= 'Z' ? char(c + 32) : c; });
-    shuffled.Add(DwgData(name, 1500000000 + static_cast<int64_t>(random() % 300000000), random() % 5000000));
+    shuffled.Add(DwgData(DrawingName(number, random), 1500000000 + static_cast<int64_t>(random() % 300000000), random() % 5000000));
   }
 
   const struct {
@@ -176,6 +153,7 @@ void BenchSort() {
 }  // namespace
 
 int main() {
+  if (!FolderReady(kMixedFolder) || !FolderReady(kDrawingFolder)) return 1;
   BenchScan();
   BenchSort();
   BenchMemory();

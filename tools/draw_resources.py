@@ -147,16 +147,12 @@ class IndexedImage:
         self.height = height
         self.pixels = [[fill] * width for _ in range(height)]
 
-    def stamp(self, rows, left, top, colour_of=None):
+    def stamp(self, rows, left, top):
         for dy, row in enumerate(rows):
             for dx, ch in enumerate(row):
                 if ch == '.':
                     continue
-                index = colour_of[ch] if colour_of and ch in colour_of else INK[ch]
-                self.pixels[top + dy][left + dx] = index
-
-    def put(self, x, y, index):
-        self.pixels[y][x] = index
+                self.pixels[top + dy][left + dx] = INK[ch]
 
 
 def magnifier(sign):
@@ -340,6 +336,10 @@ class Scaled:
         # Keep strokes at least one pixel wide on small canvases.
         return max(width * self.k, 1.0)
 
+    def fill(self, inside, colour, bounds):
+        k = self.k
+        self.c.fill(lambda x, y: inside(x / k, y / k), colour, 1.0, tuple(b * k for b in bounds))
+
     def rect(self, x0, y0, x1, y1, colour, alpha=1.0):
         k = self.k
         self.c.rect(x0 * k, y0 * k, x1 * k, y1 * k, colour, alpha)
@@ -473,66 +473,69 @@ FRAMES = 10
 
 
 def hourglass_half_width(y):
-    """Inner half width of the glass at height y (neck at y = 16)."""
+    """Inner half width of the glass at height y of the 32-unit grid (neck at y = 16)."""
     d = abs(y - 16.0)
-    if d > 9.5:
+    if d > 10.0:
         return 0.0
-    return 1.0 + 6.5 * math.sin(min(d / 8.0, 1.0) * math.pi / 2) ** 1.2
+    return 1.0 + 5.0 * math.sin(min(d / 8.0, 1.0) * math.pi / 2) ** 1.2
+
+
+def glass_outline(grow):
+    """The glass from y = 6 to 26, widened by grow on both sides."""
+    ys = [6.0 + i for i in range(21)]
+    right = [(16.0 + hourglass_half_width(y) + grow, y) for y in ys]
+    left = [(16.0 - hourglass_half_width(y) - grow, y) for y in reversed(ys)]
+    return right + left
 
 
 def draw_hourglass(frame):
-    """Frame 0: the upper bulb full; frame 9: almost all sand below, stream still running."""
+    """Frame 0: the upper bulb full; the last: almost all sand below, the stream still running.
+    Strokes lie on even pixels, so that every other pixel still makes the whole picture."""
     canvas = Canvas(32)
+    s = Scaled(canvas)
     progress = frame / (FRAMES - 1)
     cx = 16.0
-    # Glass body.
-    outline = []
-    for i in range(0, 21):
-        y = 6.5 + i * 19.0 / 20
-        outline.append((cx + hourglass_half_width(y) + 0.9, y))
-    for i in range(20, -1, -1):
-        y = 6.5 + i * 19.0 / 20
-        outline.append((cx - hourglass_half_width(y) - 0.9, y))
-    canvas.polygon(outline, GLASS_EDGE)
-    glass = []
-    for i in range(0, 21):
-        y = 6.5 + i * 19.0 / 20
-        glass.append((cx + hourglass_half_width(y), y))
-    for i in range(20, -1, -1):
-        y = 6.5 + i * 19.0 / 20
-        glass.append((cx - hourglass_half_width(y), y))
-    canvas.polygon(glass, (215, 238, 252))
+    s.polygon(glass_outline(2.0), GLASS_EDGE)
+    s.polygon(glass_outline(0.0), (215, 238, 252))
 
     # Sand in the upper bulb: its surface sinks towards the neck.
     top_level = 8.0 + progress * 7.0
-    canvas.fill(lambda x, y: top_level <= y <= 16.0 and abs(x - cx) < hourglass_half_width(y) - 0.3,
-                SAND, 1.0, (8, 7, 24, 17))
+    s.fill(lambda x, y: top_level <= y <= 16.0 and abs(x - cx) < hourglass_half_width(y),
+           SAND, (8, 6, 24, 17))
     # Sand below: a pile that grows.
-    pile_height = 1.5 + progress * 7.0
+    pile_height = 2.0 + progress * 7.0
 
     def in_pile(x, y):
-        if y < 16.5 or y > 25.5:
+        if y < 16.0 or y > 26.0:
             return False
-        surface = 25.5 - pile_height + abs(x - cx) * 0.45
-        return y >= surface and abs(x - cx) < hourglass_half_width(y) - 0.3
-    canvas.fill(in_pile, SAND, 1.0, (8, 16, 24, 26))
+        surface = 26.0 - pile_height + abs(x - cx) * 0.45
+        return y >= surface and abs(x - cx) < hourglass_half_width(y)
+    s.fill(in_pile, SAND, (8, 16, 24, 26))
     # The falling stream: grains in motion, shifted each frame.
-    stream_bottom = 25.5 - pile_height
-    y = 16.0 + (frame % 3) * 1.0
+    stream_bottom = 26.0 - pile_height
+    s.rect(cx - 1, 14.0, cx + 1, 18.0, SAND_DARK)
+    y = 18.0 + (frame % 3) * 2.0
     while y < stream_bottom:
-        canvas.rect(cx - 0.6, y, cx + 0.6, min(y + 1.6, stream_bottom), SAND_DARK)
-        y += 3.0
-    canvas.rect(cx - 0.6, 15.0, cx + 0.6, 16.6, SAND_DARK)
+        s.rect(cx - 1, y, cx + 1, min(y + 2.0, stream_bottom), SAND_DARK)
+        y += 4.0
 
-    # Highlight on the glass.
-    canvas.line(11.5, 9.0, 12.5, 12.5, 0.9, PAPER, 0.7)
+    s.line(11.0, 9.0, 12.0, 12.0, 1.0, PAPER, 0.7)  # a glint on the glass
     # Wooden caps and posts.
-    for top in (3.0, 25.5):
-        canvas.round_rect(6, top, 26, top + 3.5, 1.0, WOOD)
-        canvas.rect(7, top + 0.6, 25, top + 1.4, WOOD_LIGHT)
-    canvas.rect(7.2, 6.5, 8.6, 25.5, WOOD)
-    canvas.rect(23.4, 6.5, 24.8, 25.5, WOOD)
+    for top in (2.0, 26.0):
+        s.round_rect(4, top, 28, top + 4.0, 1.0, WOOD)
+        s.rect(6, top + 1.0, 26, top + 2.0, WOOD_LIGHT)
+    s.rect(6, 6, 8, 26, WOOD)
+    s.rect(24, 6, 26, 26, WOOD)
     return canvas
+
+
+def half_size(canvas):
+    """Every other pixel: keeps the hard edges that a filtered reduction would blur."""
+    half = Canvas(canvas.size // 2)
+    for y in range(half.size):
+        for x in range(half.size):
+            half.rgba[y][x] = canvas.rgba[2 * y + 1][2 * x + 1]
+    return half
 
 
 def to_bgra(canvas):
@@ -562,7 +565,8 @@ def dib_image(canvas):
 
 
 def icon_file(canvases, kind, hotspot=(0, 0)):
-    """An .ico (kind 1) or .cur (kind 2) file holding one 32-bit image per canvas."""
+    """An .ico (kind 1) or .cur (kind 2) file holding one 32-bit image per canvas.
+    A cursor's hot spot is given on the 32-unit grid and scaled to each image."""
     images = [dib_image(c) for c in canvases]
     out = struct.pack("<HHH", 0, kind, len(images))
     offset = 6 + 16 * len(images)
@@ -571,7 +575,7 @@ def icon_file(canvases, kind, hotspot=(0, 0)):
         if kind == 1:
             planes, bits = 1, 32
         else:
-            planes, bits = hotspot
+            planes, bits = (hotspot[0] * canvas.size // 32, hotspot[1] * canvas.size // 32)
         out += struct.pack("<BBBBHHII", size, size, 0, 0, planes, bits, len(data), offset)
         offset += len(data)
     return out + b"".join(images)
@@ -587,7 +591,7 @@ def ani_file(frames, jiffies, hotspot, name):
     anih = struct.pack("<9I", 36, len(frames), len(frames), 0, 0, 0, 0, jiffies, AF_ICON)
     info = riff_chunk(b"LIST", b"INFO" + riff_chunk(b"INAM", name.encode("ascii") + b"\0"))
     fram = riff_chunk(b"LIST", b"fram" + b"".join(
-        riff_chunk(b"icon", icon_file([f], 2, hotspot)) for f in frames))
+        riff_chunk(b"icon", icon_file(list(f), 2, hotspot)) for f in frames))
     body = b"ACON" + info + riff_chunk(b"anih", anih) + fram
     return riff_chunk(b"RIFF", body)
 
@@ -605,7 +609,8 @@ def main(argv):
     with open(os.path.join(out, "about.ico"), "wb") as f:
         f.write(icon_file([draw_about_small(), draw_about(32)], 1))
     # 8 jiffies of 1/60 s: about the 125 ms tick that steps the animation in the tree.
-    frames = [draw_hourglass(i) for i in range(FRAMES)]
+    # Each frame holds 32 and 16 pixels: the tree draws it into a small-icon square.
+    frames = [(big, half_size(big)) for big in (draw_hourglass(i) for i in range(FRAMES))]
     with open(os.path.join(out, "loading.ani"), "wb") as f:
         f.write(ani_file(frames, 8, (16, 16), "Loading"))
     return 0

@@ -33,8 +33,6 @@ VERSIONS = ["AC1018", "AC1024", "AC1027", "AC1032"]
 CODE_HEADER, CODE_BITMAP, CODE_PNG = 1, 2, 6
 HEADER_DATA_SIZE = 80
 PICTURE_SIZES = [(256, 160), (180, 112), (256, 102), (160, 160), (120, 200)]
-NAME_PATTERNS = ["Plan-{n:03d}.DWG", "door-{n}.dwg", "Stair Detail {n}.Dwg", "grid_{n:02d}.dwg",
-                 "Circle {n}.DWG", "Section B-{n}.dwg", "site plan {n}.dWG", "WINDOW{n}.dwg"]
 OTHER_NAMES = ["notes{n}.txt", "Readme{n}.TXT", "plot{n}.plt", "drawing{n}.bak", "Logo{n}.png",
                "layers{n}.ini", "archive{n}.dwg.zip"]
 COLOUR_SCHEMES = [((0, 0, 0), (255, 255, 255)), ((33, 40, 48), (255, 255, 255)),
@@ -125,7 +123,19 @@ def draw_house(c):
     c.rect(w * 0.45, h * 0.65, w * 0.55, base)
 
 
-DRAWINGS = [draw_door, draw_stair, draw_grid, draw_circle, draw_house]
+def draw_window(c):
+    w, h = c.width, c.height
+    left, top, right, bottom = w * 0.2, h * 0.1, w * 0.8, h * 0.9
+    c.rect(left, top, right, bottom)
+    c.rect(left + 6, top + 6, right - 6, bottom - 6)
+    c.line(w / 2, top + 6, w / 2, bottom - 6)
+    c.line(left + 6, h / 2, right - 6, h / 2)
+
+
+# Each name shows what its picture is, so a person can tell a tile by its drawing.
+NAMES = [("Plan-{n:03d}.DWG", draw_grid), ("door-{n}.dwg", draw_door), ("Stair Detail {n}.Dwg", draw_stair),
+         ("grid_{n:02d}.dwg", draw_grid), ("Circle {n}.DWG", draw_circle), ("Section B-{n}.dwg", draw_stair),
+         ("site plan {n}.dWG", draw_house), ("WINDOW{n}.dwg", draw_window)]
 
 
 def dib(canvas, bits, background, line):
@@ -185,7 +195,7 @@ def drawing_bytes(rng, version, entries):
     return bytes(head) + preview_block(address, entries) + tail + padding
 
 
-def make_entries(rng, kind):
+def make_entries(rng, kind, drawing):
     header = (CODE_HEADER, bytes(HEADER_DATA_SIZE))
     if kind == "empty":
         return []
@@ -193,7 +203,7 @@ def make_entries(rng, kind):
         return [header]
     width, height = rng.choice(PICTURE_SIZES)
     canvas = Canvas(width, height)
-    rng.choice(DRAWINGS)(canvas)
+    drawing(canvas)
     background, line = rng.choice(COLOUR_SCHEMES)
     if kind == "png":
         return [header, (CODE_PNG, png(canvas, background, line))]
@@ -224,10 +234,10 @@ def main():
     for index in range(args.count):
         version = rng.choice(VERSIONS)
         kind = picture_kind(rng, index, version)
-        name = NAME_PATTERNS[index % len(NAME_PATTERNS)].format(n=index + 1)
-        path = os.path.join(args.outdir, name)
+        pattern, drawing = NAMES[index % len(NAMES)]
+        path = os.path.join(args.outdir, pattern.format(n=index + 1))
         with open(path, "wb") as out:
-            out.write(drawing_bytes(rng, version, make_entries(rng, kind)))
+            out.write(drawing_bytes(rng, version, make_entries(rng, kind, drawing)))
         stamp = NEWEST_TIME - rng.randrange(0, 5 * 365) * ONE_DAY - rng.randrange(0, ONE_DAY)
         os.utime(path, (stamp, stamp))
     for index in range(args.other_files):

@@ -17,4 +17,4 @@ struct DecodedPicture {
   bool hasAlpha = false;
 };
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

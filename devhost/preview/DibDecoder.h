@@ -14,4 +14,4 @@ namespace devhost::preview {
 // else or anything that does not fit in size bytes; out is then empty.
 bool decodeDib(const uint8_t *data, size_t size, DecodedPicture &out);
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

@@ -9,7 +9,7 @@ uint32_t le32(const uint8_t *p) { return le16(p) | le16(p + 2) << 16; }
 int32_t s16(const uint8_t *p) { return int16_t(uint16_t(le16(p))); }
 
 constexpr uint32_t kEmrHeader = 1;
-constexpr uint32_t kEmfSignature = 0x464D4520; // " EMF"
+constexpr uint32_t kEmfSignature = 0x464D4520;  // " EMF"
 constexpr size_t kEnhHeaderMin = 88;
 constexpr uint32_t kPlaceableKey = 0x9AC6CDD7;
 constexpr size_t kPlaceableSize = 22;
@@ -28,8 +28,7 @@ void setAspect(MetafileLayout &layout, int64_t width, int64_t height) {
 std::optional<MetafileLayout> inspectEnhanced(const uint8_t *data, size_t size) {
   const uint32_t headerSize = le32(data + 4);
   const uint32_t totalSize = le32(data + 48);
-  if (headerSize < kEnhHeaderMin || headerSize > totalSize || totalSize > size)
-    return std::nullopt;
+  if (headerSize < kEnhHeaderMin || headerSize > totalSize || totalSize > size) return std::nullopt;
   MetafileLayout layout;
   layout.kind = MetafileKind::Enhanced;
   layout.size = totalSize;
@@ -41,14 +40,12 @@ std::optional<MetafileLayout> inspectEnhanced(const uint8_t *data, size_t size) 
 }
 
 std::optional<MetafileLayout> inspectWindows(const uint8_t *data, size_t size, size_t offset) {
-  if (offset > size || size - offset < kWmfHeaderSize)
-    return std::nullopt;
+  if (offset > size || size - offset < kWmfHeaderSize) return std::nullopt;
   const uint8_t *header = data + offset;
   const uint32_t type = le16(header);
   const uint32_t headerWords = le16(header + 2);
   const uint64_t totalBytes = uint64_t(le32(header + 6)) * 2;
-  if ((type != 1 && type != 2) || headerWords != kWmfHeaderSize / 2 || totalBytes < kWmfHeaderSize ||
-      totalBytes > size - offset)
+  if ((type != 1 && type != 2) || headerWords != kWmfHeaderSize / 2 || totalBytes < kWmfHeaderSize || totalBytes > size - offset)
     return std::nullopt;
   MetafileLayout layout;
   layout.kind = MetafileKind::Windows;
@@ -64,8 +61,7 @@ void findWindowExtent(const uint8_t *data, MetafileLayout &layout) {
   const size_t end = layout.offset + layout.size;
   for (int i = 0; i < kRecordsToScan && end - at >= 6; ++i) {
     const uint64_t recordBytes = uint64_t(le32(data + at)) * 2;
-    if (recordBytes < 6 || recordBytes > end - at)
-      return;
+    if (recordBytes < 6 || recordBytes > end - at) return;
     if (le16(data + at + 4) == kMetaSetWindowExt && recordBytes >= 10) {
       setAspect(layout, s16(data + at + 8), s16(data + at + 6));
       return;
@@ -74,23 +70,19 @@ void findWindowExtent(const uint8_t *data, MetafileLayout &layout) {
   }
 }
 
-} // namespace
+}  // namespace
 
 std::optional<MetafileLayout> inspectMetafile(const uint8_t *data, size_t size) {
-  if (data == nullptr || size < kWmfHeaderSize)
-    return std::nullopt;
-  if (size >= kEnhHeaderMin && le32(data) == kEmrHeader && le32(data + 40) == kEmfSignature)
-    return inspectEnhanced(data, size);
+  if (data == nullptr || size < kWmfHeaderSize) return std::nullopt;
+  if (size >= kEnhHeaderMin && le32(data) == kEmrHeader && le32(data + 40) == kEmfSignature) return inspectEnhanced(data, size);
   if (le32(data) == kPlaceableKey) {
     auto layout = inspectWindows(data, size, kPlaceableSize);
-    if (layout)
-      setAspect(*layout, int64_t(s16(data + 10)) - s16(data + 6), int64_t(s16(data + 12)) - s16(data + 8));
+    if (layout) setAspect(*layout, int64_t(s16(data + 10)) - s16(data + 6), int64_t(s16(data + 12)) - s16(data + 8));
     return layout;
   }
   auto layout = inspectWindows(data, size, 0);
-  if (layout)
-    findWindowExtent(data, *layout);
+  if (layout) findWindowExtent(data, *layout);
   return layout;
 }
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

@@ -23,4 +23,4 @@ struct MetafileLayout {
 // Nothing when the bytes are not a metafile whose header agrees with the bytes there are.
 std::optional<MetafileLayout> inspectMetafile(const uint8_t *data, size_t size);
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

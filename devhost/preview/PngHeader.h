@@ -11,4 +11,4 @@ namespace devhost::preview {
 // kMaxPictureSide on each side.
 bool readPngSize(const uint8_t *data, size_t size, uint32_t &width, uint32_t &height);
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

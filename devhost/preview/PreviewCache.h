@@ -21,18 +21,18 @@ struct PreviewKey {
 };
 
 // Image is anything with cost(): the bytes it holds.
-template <class Image> class PreviewCache {
-public:
+template <class Image>
+class PreviewCache {
+ public:
   PreviewCache(size_t maxEntries, size_t maxBytes) : m_maxEntries(maxEntries), m_maxBytes(maxBytes) {}
 
   // The image kept for exactly this file, or null.
   std::shared_ptr<const Image> find(const PreviewKey &key) {
     const auto found = m_byPath.find(key.path);
-    if (found == m_byPath.end())
-      return nullptr;
+    if (found == m_byPath.end()) return nullptr;
     const typename Order::iterator slot = found->second;
     if (slot->key.size != key.size || slot->key.lastWrite != key.lastWrite) {
-      erase(slot); // the drawing changed since it was decoded
+      erase(slot);  // the drawing changed since it was decoded
       return nullptr;
     }
     m_entries.splice(m_entries.begin(), m_entries, slot);
@@ -42,11 +42,9 @@ public:
   // Keeps the image unless it alone exceeds the byte budget, evicting the oldest to make room.
   void store(const PreviewKey &key, std::shared_ptr<const Image> image) {
     const auto found = m_byPath.find(key.path);
-    if (found != m_byPath.end())
-      erase(found->second);
+    if (found != m_byPath.end()) erase(found->second);
     const size_t cost = image->cost() + key.path.size() * sizeof(wchar_t);
-    if (cost > m_maxBytes || m_maxEntries == 0)
-      return;
+    if (cost > m_maxBytes || m_maxEntries == 0) return;
     while (!m_entries.empty() && (m_entries.size() >= m_maxEntries || m_bytes + cost > m_maxBytes))
       erase(std::prev(m_entries.end()));
     m_entries.push_front(Slot{key, std::move(image), cost});
@@ -63,13 +61,13 @@ public:
   size_t entryCount() const { return m_entries.size(); }
   size_t bytesHeld() const { return m_bytes; }
 
-private:
+ private:
   struct Slot {
     PreviewKey key;
     std::shared_ptr<const Image> image;
     size_t cost;
   };
-  using Order = std::list<Slot>; // most recently used first
+  using Order = std::list<Slot>;  // most recently used first
 
   void erase(typename Order::iterator slot) {
     m_bytes -= slot->cost;
@@ -84,4 +82,4 @@ private:
   std::unordered_map<std::wstring, typename Order::iterator> m_byPath;
 };
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

@@ -12,7 +12,7 @@ namespace devhost::preview {
 
 enum PreviewCode : uint8_t {
   kHeaderData = 1,
-  kBitmap = 2, // device-independent bitmap without a file header
+  kBitmap = 2,  // device-independent bitmap without a file header
   kMetafile = 3,
   kPng = 6,
 };
@@ -43,4 +43,4 @@ std::vector<PreviewEntry> picturesByPreference(const PreviewDirectory &directory
 // The bytes of one entry; false when it is too large or cannot be read.
 bool readEntryBytes(PreviewSource &source, const PreviewEntry &entry, std::vector<uint8_t> &bytes);
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

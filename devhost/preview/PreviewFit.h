@@ -15,4 +15,4 @@ struct FitRect {
 // Empty (zero width and height) when either the picture or the area is empty.
 FitRect fitCentred(uint32_t pictureWidth, uint32_t pictureHeight, int32_t areaWidth, int32_t areaHeight);
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

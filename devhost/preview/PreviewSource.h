@@ -10,7 +10,7 @@
 namespace devhost::preview {
 
 class PreviewSource {
-public:
+ public:
   virtual ~PreviewSource() = default;
   virtual uint64_t size() const = 0;
   // Reads exactly count bytes at offset; false when the range is not all there.
@@ -18,20 +18,18 @@ public:
 };
 
 class MemorySource final : public PreviewSource {
-public:
+ public:
   MemorySource(const uint8_t *data, size_t size) : m_data(data), m_size(size) {}
   uint64_t size() const override { return m_size; }
   bool read(uint64_t offset, void *into, size_t count) override {
-    if (offset > m_size || count > m_size - offset)
-      return false;
-    if (count != 0)
-      std::memcpy(into, m_data + offset, count);
+    if (offset > m_size || count > m_size - offset) return false;
+    if (count != 0) std::memcpy(into, m_data + offset, count);
     return true;
   }
 
-private:
+ private:
   const uint8_t *m_data;
   size_t m_size;
 };
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

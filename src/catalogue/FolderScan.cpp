@@ -1,6 +1,7 @@
 #include "catalogue/FolderScan.h"
 
 #include "catalogue/DwgData.h"
+#include "catalogue/ListingCollector.h"
 #include "catalogue/Ombra3Doc.h"
 #include "catalogue/ScanFilter.h"
 
@@ -40,10 +41,11 @@ bool ScanFolder(const std::string &path, const char *extension) {
   _finddata64i32_t entry;
   const FindListing listing(_findfirst64i32((path + "\\*").c_str(), &entry));
   if (!listing.IsOpen()) return false;
-  DwgCatalogue &catalogue = *g_pCatalogue;
+  ListingCollector records;
   do {
     if (TakeListingEntry(entry.name, (entry.attrib & _A_SUBDIR) != 0, extension))
-      catalogue.Add(DwgData(entry.name, entry.time_write, static_cast<uint32_t>(entry.size)));
+      records.Add(entry.name, entry.time_write, static_cast<uint32_t>(entry.size));
   } while (_findnext64i32(listing.Handle(), &entry) == 0);
+  records.MoveInto(*g_pCatalogue, kCatalogueGrowBy);
   return true;
 }

@@ -1,6 +1,59 @@
 #include "explorer/MdiMixin.h"
 
+#include "catalogue/Ombra3Doc.h"
+#include "explorer/FramePlacement.h"
+#include "explorer/MainFrame.h"
+#include "fw/Dialog.h"
+#include "fw/FrameWnd.h"
+#include "host/HostApi.h"
+#include "host/ShellPathCompose.h"
+
+
 bool CMdiMixin::SetFrameResource(UINT resourceId) {
   m_nFrameResource = resourceId;
   return true;
 }
+
+bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
+  new COmbra3Doc;
+  auto *frame = new CMainFrame;
+  HWND hostFrame = static_cast<HWND>(acedGetAcadFrame());
+  if (hostFrame) ::EnableWindow(hostFrame, FALSE);
+  if (!frame->LoadFrame(m_nFrameResource, WS_OVERLAPPEDWINDOW | fw::FWS_ADDTOTITLE, dialog)) {
+    if (hostFrame) ::EnableWindow(hostFrame, TRUE);
+    return false;
+  }
+  m_pMainWnd = dialog;
+  frame->ShowWindow(SW_SHOW);
+
+  RECT dialogRect;
+  dialog->GetWindowRect(&dialogRect);
+  const FramePlacement placement = PlaceFrame({dialogRect.left, dialogRect.top, dialogRect.right, dialogRect.bottom},
+                                              g_pDoc->m_nWindowWidth, g_pDoc->m_nWindowHeight);
+
+  if (placement.maximized) {
+    frame->ShowWindow(SW_SHOWMAXIMIZED);
+  } else {
+    if (placement.resized)
+      ::MoveWindow(frame->m_hWnd, placement.x, placement.y, g_pDoc->m_nWindowWidth, g_pDoc->m_nWindowHeight, TRUE);
+    frame->ShowWindow(SW_SHOW);
+  }
+  frame->UpdateWindow();
+  frame->EnableAccept(false);
+  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(FileBaseName(g_pDoc->m_strName));
+  g_pDoc->m_strName.clear();
+  return true;
+}
+
+std::string CMdiMixin::GetFolderPath() const { return g_pDoc ? g_pDoc->m_strPath : std::string(); }
+
+std::string CMdiMixin::GetFileName() const { return g_pDoc ? g_pDoc->m_strName : std::string(); }
+
+std::string CMdiMixin::GetFullPath() const {
+  if (!g_pDoc) return std::string();
+  std::string &folder = g_pDoc->m_strPath;
+  if (folder.empty() || folder.back() != '\\') folder += '\\';
+  return folder + g_pDoc->m_strName;
+}
+
+void CMdiMixin::DeleteDocument() { delete g_pDoc; }

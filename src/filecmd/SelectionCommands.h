@@ -11,5 +11,6 @@
 bool CopySelected(const DwgCatalogue &catalogue, const std::string &folder);
 // Deletes the marked drawings to the recycle bin, with the shell's confirmation; returns the
 // shell's result, which callers need not look at: they scan the folder again in any case.
+// With nothing marked the shell is not called at all (non-zero result, nothing touched).
 int DeleteSelected(const DwgCatalogue &catalogue, const std::string &folder);
 bool PasteFiles();

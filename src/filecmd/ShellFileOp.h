@@ -17,7 +17,8 @@ public:
   CShellFileOp &operator=(const CShellFileOp &) = delete;
 
   // which 0: the source list, any other value: the destination list. False when the path could
-  // not be added (no path, or no memory); the list is then kept as it was but refuses to run.
+  // not be added (null or empty, or no memory); the list is then kept as it was but refuses to
+  // run.
   bool AddFile(int which, const char *path);
   void ClearFiles(int which);
 

@@ -5,7 +5,8 @@
 
 bool AppendShellListPath(char *&buffer, int &capacity, int &used, char *&end, const char *path,
                          ShellListReallocate reallocate) {
-  if (!path) return false;
+  // An empty path would end the list early and hide the paths after it.
+  if (!path || !*path) return false;
   const size_t length = std::strlen(path) + 1;
   const size_t need = static_cast<size_t>(used) + 1 + length;
   if (length > INT_MAX || need > INT_MAX) return false;

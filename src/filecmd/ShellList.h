@@ -7,7 +7,8 @@
 using ShellListReallocate = void *(*)(void *block, size_t size);
 
 // Appends path to the list held in buffer (capacity bytes, used bytes of paths without the
-// final NUL, end where the next path goes). On a failed allocation, or a list that would pass
-// what an int counts, the list stays exactly as it was and false is returned.
+// final NUL, end where the next path goes). For a null or empty path, a failed allocation, or
+// a list that would pass what an int counts, the list stays exactly as it was and false is
+// returned.
 bool AppendShellListPath(char *&buffer, int &capacity, int &used, char *&end, const char *path,
                          ShellListReallocate reallocate);

@@ -3,6 +3,7 @@
 // just above it; the pane window (id AFX_IDW_PANE_FIRST) fills what is left.
 #pragma once
 
+#include "fw/FrameworkIds.h"
 #include "fw/Wnd.h"
 
 #include <string>
@@ -26,11 +27,6 @@ constexpr DWORD CBRS_GRIPPER = 0x00400000;
 constexpr DWORD CBRS_TOP = CBRS_ALIGN_TOP | CBRS_BORDER_BOTTOM;
 constexpr DWORD CBRS_BOTTOM = CBRS_ALIGN_BOTTOM | CBRS_BORDER_TOP;
 constexpr DWORD CBRS_ALL = 0x0040FFFF;
-
-// Child window ids the frame knows.
-constexpr UINT AFX_IDW_TOOLBAR = 0xE800;
-constexpr UINT AFX_IDW_STATUS_BAR = 0xE801;
-constexpr UINT AFX_IDW_PANE_FIRST = 0xE900;
 
 class CControlBar : public CWnd {
 public:

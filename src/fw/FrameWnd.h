@@ -4,6 +4,7 @@
 #pragma once
 
 #include "fw/ControlBar.h"
+#include "fw/FrameworkIds.h"
 #include "fw/Wnd.h"
 
 #include <string>
@@ -19,13 +20,6 @@ constexpr DWORD FWS_ADDTOTITLE = 0x00008000;
 constexpr UINT WM_SETMESSAGESTRING = 0x0362;  // wParam: string id, or lParam: the text
 constexpr UINT WM_IDLEUPDATECMDUI = 0x0363;
 
-// Framework command ids the frame handles itself.
-constexpr UINT ID_APP_EXIT = 0xE141;
-constexpr UINT ID_VIEW_TOOLBAR = 0xE800;
-constexpr UINT ID_VIEW_STATUS_BAR = 0xE801;
-constexpr UINT ID_NEXT_PANE = 0xE150;
-constexpr UINT ID_PREV_PANE = 0xE151;
-constexpr UINT AFX_IDS_IDLEMESSAGE = 0xE001;
 
 class CFrameWnd : public CWnd {
 public:

@@ -120,7 +120,10 @@ bool COleDataSource::SetClipboard() {
   m_cache.clear();
   if (!source) return false;
   if (FAILED(OleSetClipboard(source.Get()))) return false;
-  return SUCCEEDED(OleFlushClipboard());
+  if (SUCCEEDED(OleFlushClipboard())) return true;
+  // The clipboard must not keep a data object whose code may be unloaded before it is asked.
+  OleSetClipboard(nullptr);
+  return false;
 }
 
 }  // namespace fw

@@ -12,6 +12,14 @@ FolderPathParts SplitFolderPath(const std::string &path) {
   return parts;
 }
 
+std::string FileBaseName(const std::string &path) {
+  const size_t lastSeparator = path.find_last_of("\\/:");
+  std::string name = lastSeparator == std::string::npos ? path : path.substr(lastSeparator + 1);
+  const size_t dot = name.find_last_of('.');
+  if (dot != std::string::npos) name.erase(dot);
+  return name;
+}
+
 std::string ComposeStartShellPath(const ShellFolderNames &names, const std::string &driveDisplayName,
                                   const std::string &directory) {
   std::string path = names.desktop + "\\";

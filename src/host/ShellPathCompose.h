@@ -12,6 +12,9 @@ struct FolderPathParts {
 // Splits as _splitpath does; the file name and extension are dropped.
 FolderPathParts SplitFolderPath(const std::string &path);
 
+// The file name without folder and extension, as _splitpath gives it ("plan" of "plan.dwg").
+std::string FileBaseName(const std::string &path);
+
 struct ShellFolderNames {
   std::string desktop;
   std::string drives;

@@ -31,10 +31,9 @@ DibSpec spec(int32_t width, int32_t height, uint16_t bitCount) {
   return s;
 }
 
-constexpr uint32_t kBlack = 0xFF000000, kWhite = 0xFFFFFFFF, kRed = 0xFFFF0000, kGreen = 0xFF00FF00,
-                   kBlue = 0xFF0000FF;
+constexpr uint32_t kBlack = 0xFF000000, kWhite = 0xFFFFFFFF, kRed = 0xFFFF0000, kGreen = 0xFF00FF00, kBlue = 0xFF0000FF;
 
-} // namespace
+}  // namespace
 
 TEST(PreviewBitmap, PalettedDepthsReadBitsFromTheHighEnd) {
   // 1 bit, 10 pixels wide: two bytes of pixels padded to four; bottom row first in the file.
@@ -70,15 +69,15 @@ TEST(PreviewBitmap, SixteenBitsAsFiveFiveFiveOrWithMasks) {
 
   DibSpec fields = spec(3, 1, 16);
   fields.compression = 3;
-  fields.masks = {0xF800, 0x07E0, 0x001F}; // 5-6-5
+  fields.masks = {0xF800, 0x07E0, 0x001F};  // 5-6-5
   const auto rgb565 = decode(buildDib(fields, {0x00, 0xF8, 0xE0, 0x07, 0x1F, 0x00, 0, 0}));
   EXPECT_EQ(rgb565.pixels, (std::vector<uint32_t>{kRed, kGreen, kBlue}));
 }
 
 TEST(PreviewBitmap, TrueColourRowsPaddingAndOrientation) {
   // Three pixels of 24 bits: nine bytes padded to twelve per row.
-  const Bytes rows = {0, 0, 255, 0, 255, 0, 255, 0, 0, 0, 0, 0, /* second row */
-                      255, 255, 255, 0, 0, 0, 0, 0, 0, 9, 9, 9};
+  const Bytes rows = {0,   0,   255, 0, 255, 0, 255, 0, 0, 0, 0, 0, /* second row */
+                      255, 255, 255, 0, 0,   0, 0,   0, 0, 9, 9, 9};
   const auto bottomUp = decode(buildDib(spec(3, 2, 24), rows));
   EXPECT_EQ(bottomUp.pixels, (std::vector<uint32_t>{kWhite, kBlack, kBlack, kRed, kGreen, kBlue}));
   const auto topDown = decode(buildDib(spec(3, -2, 24), rows));
@@ -102,12 +101,10 @@ TEST(PreviewBitmapHostile, ImpossibleHeadersAreRefused) {
   const Bytes pixel = {1, 2, 3, 0};
   EXPECT_TRUE(refuses({}));
   EXPECT_TRUE(refuses(Bytes(39, 0)));
-  for (int32_t width : {0, -1, 4097, INT32_MIN})
-    EXPECT_TRUE(refuses(buildDib(spec(width, 1, 24), pixel))) << "width " << width;
+  for (int32_t width : {0, -1, 4097, INT32_MIN}) EXPECT_TRUE(refuses(buildDib(spec(width, 1, 24), pixel))) << "width " << width;
   for (int32_t height : {0, 4097, -4097, INT32_MIN})
     EXPECT_TRUE(refuses(buildDib(spec(1, height, 24), pixel))) << "height " << height;
-  for (uint16_t bits : {0, 2, 7, 48})
-    EXPECT_TRUE(refuses(buildDib(spec(1, 1, bits), Bytes(64, 0)))) << bits << " bits";
+  for (uint16_t bits : {0, 2, 7, 48}) EXPECT_TRUE(refuses(buildDib(spec(1, 1, bits), Bytes(64, 0)))) << bits << " bits";
   for (uint32_t headerSize : {12u, 41u, 200u, 0xFFFFFFFFu}) {
     DibSpec s = spec(1, 1, 24);
     s.headerSize = headerSize;
@@ -144,7 +141,7 @@ TEST(PreviewBitmapHostile, PaletteOrPixelsBeyondTheEntryAreRefused) {
   EXPECT_TRUE(refuses(buildDib(tooManyColours, {0, 0, 0, 0}))) << "more colours than 4 bits index";
 
   DibSpec hugeColours = spec(1, 1, 24);
-  hugeColours.colorsUsed = 0x40000000; // colours times four wraps a 32-bit size
+  hugeColours.colorsUsed = 0x40000000;  // colours times four wraps a 32-bit size
   EXPECT_TRUE(refuses(buildDib(hugeColours, {0, 0, 0, 0})));
 
   // The largest allowed picture with its rows missing: refused before anything is allocated.

@@ -2,6 +2,7 @@
 // ones built in memory.
 #include "PreviewTestFiles.h"
 #include "preview/DibDecoder.h"
+#include "preview/PngHeader.h"
 #include "preview/PreviewDirectory.h"
 
 #include <gtest/gtest.h>
@@ -17,7 +18,7 @@ namespace {
 
 // Counts what a parse costs, so the tests can hold it to "header and picture only".
 class CountingSource final : public PreviewSource {
-public:
+ public:
   explicit CountingSource(const Bytes &bytes) : m_inner(bytes.data(), bytes.size()) {}
   uint64_t size() const override { return m_inner.size(); }
   bool read(uint64_t offset, void *into, size_t count) override {
@@ -26,7 +27,7 @@ public:
   }
   uint64_t bytesRead() const { return m_bytesRead; }
 
-private:
+ private:
   MemorySource m_inner;
   uint64_t m_bytesRead = 0;
 };
@@ -52,9 +53,9 @@ struct FixtureCase {
   const char *file;
   bool hasDirectory;
   size_t entryCount;
-  uint8_t chosenCode; // 0: no picture
+  uint8_t chosenCode;  // 0: no picture
   uint32_t chosenSize;
-  uint32_t width, height; // of a chosen bitmap
+  uint32_t width, height;  // of the chosen picture
 };
 
 const FixtureCase kFixtures[] = {
@@ -63,18 +64,17 @@ const FixtureCase kFixtures[] = {
     {"r2004-hatch.dwg", true, 2, kBitmap, 21856, 184, 113},
     {"r2007-two-bitmaps.dwg", true, 3, kBitmap, 163880, 256, 160},
     {"r2010-line.dwg", true, 2, kBitmap, 27176, 256, 102},
-    {"r2013-arc-png.dwg", true, 2, kPng, 1088, 0, 0},
-    {"r2013-leader-png.dwg", true, 2, kPng, 14976, 0, 0},
+    {"r2013-arc-png.dwg", true, 2, kPng, 1088, 256, 102},
+    {"r2013-leader-png.dwg", true, 2, kPng, 14976, 591, 448},
     {"r2018-header-only.dwg", true, 1, 0, 0, 0, 0},
     {"r2018-no-images.dwg", true, 0, 0, 0, 0, 0},
     {"r11-no-preview.dwg", false, 0, 0, 0, 0, 0},
 };
 
-} // namespace
+}  // namespace
 
 TEST(PreviewFixtures, DirectoryPictureChoiceAndBytesRead) {
-  if (!std::filesystem::is_directory(fixtureFolder()))
-    GTEST_SKIP() << "no fixtures at " << fixtureFolder();
+  if (!std::filesystem::is_directory(fixtureFolder())) GTEST_SKIP() << "no fixtures at " << fixtureFolder();
   for (const FixtureCase &c : kFixtures) {
     SCOPED_TRACE(c.file);
     const Bytes file = readFile(fixtureFolder() / c.file);
@@ -82,11 +82,9 @@ TEST(PreviewFixtures, DirectoryPictureChoiceAndBytesRead) {
     CountingSource source(file);
     const auto directory = readPreviewDirectory(source);
     ASSERT_EQ(directory.has_value(), c.hasDirectory);
-    if (!directory)
-      continue;
+    if (!directory) continue;
     EXPECT_EQ(directory->entries.size(), c.entryCount);
-    if (c.entryCount != 0)
-      EXPECT_EQ(directory->entries.front().code, kHeaderData);
+    if (c.entryCount != 0) EXPECT_EQ(directory->entries.front().code, kHeaderData);
 
     const auto pictures = picturesByPreference(*directory);
     if (c.chosenCode == 0) {
@@ -102,8 +100,10 @@ TEST(PreviewFixtures, DirectoryPictureChoiceAndBytesRead) {
     // The drawing itself is never read: only the directory and the chosen picture.
     EXPECT_LE(source.bytesRead(), picture.size() + 4096);
     if (c.chosenCode == kPng) {
-      const uint8_t signature[8] = {0x89, 'P', 'N', 'G', '\r', '\n', 0x1A, '\n'};
-      EXPECT_EQ(0, std::memcmp(picture.data(), signature, 8));
+      uint32_t width = 0, height = 0;
+      EXPECT_TRUE(readPngSize(picture.data(), picture.size(), width, height));
+      EXPECT_EQ(width, c.width);
+      EXPECT_EQ(height, c.height);
       continue;
     }
     DecodedPicture decoded;
@@ -114,18 +114,15 @@ TEST(PreviewFixtures, DirectoryPictureChoiceAndBytesRead) {
 }
 
 TEST(PreviewFixtures, EveryBitmapOfEveryFixtureDecodes) {
-  if (!std::filesystem::is_directory(fixtureFolder()))
-    GTEST_SKIP() << "no fixtures at " << fixtureFolder();
+  if (!std::filesystem::is_directory(fixtureFolder())) GTEST_SKIP() << "no fixtures at " << fixtureFolder();
   int bitmaps = 0;
   for (const auto &item : std::filesystem::directory_iterator(fixtureFolder())) {
-    if (item.path().extension() != ".dwg")
-      continue;
+    if (item.path().extension() != ".dwg") continue;
     SCOPED_TRACE(item.path().filename().string());
     const Bytes file = readFile(item.path());
     const auto pictures = picturesOf(file);
     for (const PreviewEntry &entry : pictures) {
-      if (entry.code != kBitmap)
-        continue;
+      if (entry.code != kBitmap) continue;
       ++bitmaps;
       DecodedPicture decoded;
       ASSERT_TRUE(decodeDib(file.data() + entry.start, entry.size, decoded));
@@ -135,8 +132,7 @@ TEST(PreviewFixtures, EveryBitmapOfEveryFixtureDecodes) {
         ASSERT_EQ(pixel >> 24, 0xFFu);
       }
       // The chosen picture is a line drawing; a second, smaller one may be left blank.
-      if (entry.start == pictures.front().start)
-        EXPECT_TRUE(varied);
+      if (entry.start == pictures.front().start) EXPECT_TRUE(varied);
     }
   }
   EXPECT_EQ(bitmaps, 6);
@@ -171,9 +167,9 @@ TEST(PreviewDirectoryHostile, EntriesOutsideTheFileAreDropped) {
   Bytes file = previewtest::buildDrawing(
       {previewtest::headerData(), {kPng, Bytes(64, 2)}, {kBitmap, Bytes(64, 3)}, {kMetafile, Bytes(64, 4)}});
   const size_t table = previewtest::kDirectoryAddress + 21;
-  previewtest::set32(file, table + 9 + 5, uint32_t(file.size()));            // PNG: size beyond the file
-  previewtest::set32(file, table + 18 + 1, 0xFFFFFFF0);                      // bitmap: start + size wraps
-  previewtest::set32(file, table + 27 + 1, uint32_t(file.size() - 63));      // metafile: one byte short
+  previewtest::set32(file, table + 9 + 5, uint32_t(file.size()));        // PNG: size beyond the file
+  previewtest::set32(file, table + 18 + 1, 0xFFFFFFF0);                  // bitmap: start + size wraps
+  previewtest::set32(file, table + 27 + 1, uint32_t(file.size() - 63));  // metafile: one byte short
   const auto directory = directoryOf(file);
   ASSERT_TRUE(directory);
   ASSERT_EQ(directory->entries.size(), 1u);
@@ -201,17 +197,16 @@ TEST(PreviewDirectory, PreferencePngThenLargestBitmapThenMetafile) {
 TEST(PreviewDirectory, OversizedPictureIsNeitherChosenNorRead) {
   // The entry claims more than any preview may hold; the source claims to be that large.
   class HugeSource final : public PreviewSource {
-  public:
+   public:
     explicit HugeSource(const Bytes &head) : m_head(head) {}
     uint64_t size() const override { return 1ull << 32; }
     bool read(uint64_t offset, void *into, size_t count) override {
-      if (offset + count > m_head.size())
-        return false;
+      if (offset + count > m_head.size()) return false;
       std::memcpy(into, m_head.data() + offset, count);
       return true;
     }
 
-  private:
+   private:
     Bytes m_head;
   };
   Bytes file = previewtest::buildDrawing({previewtest::headerData(), {kBitmap, Bytes(16, 0)}});
@@ -224,4 +219,29 @@ TEST(PreviewDirectory, OversizedPictureIsNeitherChosenNorRead) {
   Bytes bytes;
   EXPECT_FALSE(readEntryBytes(source, directory->entries[1], bytes));
   EXPECT_TRUE(bytes.empty());
+}
+
+TEST(PreviewPngHeader, SizeIsReadAndBoundedBeforeDecoding) {
+  const Bytes png = previewtest::buildPng(300, 7, [](int, int) { return 0u; });
+  uint32_t width = 0, height = 0;
+  ASSERT_TRUE(readPngSize(png.data(), png.size(), width, height));
+  EXPECT_EQ(width, 300u);
+  EXPECT_EQ(height, 7u);
+
+  const auto withSize = [&](uint32_t w, uint32_t h) {
+    Bytes changed = png;
+    for (int i = 0; i < 4; ++i) {
+      changed[16 + i] = uint8_t(w >> (24 - 8 * i));
+      changed[20 + i] = uint8_t(h >> (24 - 8 * i));
+    }
+    return readPngSize(changed.data(), changed.size(), width, height);
+  };
+  EXPECT_TRUE(withSize(4096, 4096));
+  EXPECT_FALSE(withSize(4097, 1)) << "a small file announcing a huge picture";
+  EXPECT_FALSE(withSize(1, 0x80000000));
+  EXPECT_FALSE(withSize(0, 5));
+  EXPECT_FALSE(readPngSize(png.data(), 23, width, height)) << "cut inside the image header";
+  Bytes notPng = png;
+  notPng[1] = 'Q';
+  EXPECT_FALSE(readPngSize(notPng.data(), notPng.size(), width, height));
 }

@@ -10,8 +10,7 @@ using previewtest::Bytes;
 
 namespace {
 
-void expectFit(const FitRect &fit, int32_t left, int32_t top, int32_t width, int32_t height,
-               const char *what = "") {
+void expectFit(const FitRect &fit, int32_t left, int32_t top, int32_t width, int32_t height, const char *what = "") {
   SCOPED_TRACE(what);
   EXPECT_EQ(fit.left, left);
   EXPECT_EQ(fit.top, top);
@@ -19,7 +18,7 @@ void expectFit(const FitRect &fit, int32_t left, int32_t top, int32_t width, int
   EXPECT_EQ(fit.height, height);
 }
 
-} // namespace
+}  // namespace
 
 TEST(PreviewFit, ScalesToFitKeepingAspectAndCentres) {
   expectFit(fitCentred(256, 160, 256, 160), 0, 0, 256, 160);
@@ -32,8 +31,8 @@ TEST(PreviewFit, ScalesToFitKeepingAspectAndCentres) {
 }
 
 TEST(PreviewFit, EmptyPictureOrAreaGivesNothing) {
-  for (const FitRect &fit : {fitCentred(0, 10, 100, 100), fitCentred(10, 0, 100, 100),
-                             fitCentred(10, 10, 0, 100), fitCentred(10, 10, 100, -5)}) {
+  for (const FitRect &fit :
+       {fitCentred(0, 10, 100, 100), fitCentred(10, 0, 100, 100), fitCentred(10, 10, 0, 100), fitCentred(10, 10, 100, -5)}) {
     EXPECT_EQ(fit.width, 0);
     EXPECT_EQ(fit.height, 0);
   }
@@ -43,10 +42,9 @@ namespace {
 
 Bytes enhancedMetafile(int32_t frameRight, int32_t frameBottom, uint32_t totalSize) {
   Bytes b;
-  previewtest::put32(b, 1);  // EMR_HEADER
-  previewtest::put32(b, 88); // header size
-  for (int32_t v : {0, 0, 100, 100, 0, 0, frameRight, frameBottom})
-    previewtest::put32(b, uint32_t(v));
+  previewtest::put32(b, 1);   // EMR_HEADER
+  previewtest::put32(b, 88);  // header size
+  for (int32_t v : {0, 0, 100, 100, 0, 0, frameRight, frameBottom}) previewtest::put32(b, uint32_t(v));
   previewtest::put32(b, 0x464D4520);
   previewtest::put32(b, 0x10000);
   previewtest::put32(b, totalSize);
@@ -63,16 +61,16 @@ Bytes windowsMetafile(int16_t extentX, int16_t extentY) {
   previewtest::put16(b, 0);
   previewtest::put32(b, 5);
   previewtest::put16(b, 0);
-  previewtest::put32(b, 5); // SetWindowExt(y, x)
+  previewtest::put32(b, 5);  // SetWindowExt(y, x)
   previewtest::put16(b, 0x020C);
   previewtest::put16(b, uint16_t(extentY));
   previewtest::put16(b, uint16_t(extentX));
-  previewtest::put32(b, 3); // end of file
+  previewtest::put32(b, 3);  // end of file
   previewtest::put16(b, 0);
   return b;
 }
 
-} // namespace
+}  // namespace
 
 TEST(PreviewMetafile, KindsAndAspect) {
   const Bytes emf = enhancedMetafile(2000, 1000, 120);
@@ -94,7 +92,7 @@ TEST(PreviewMetafile, KindsAndAspect) {
   Bytes placeable;
   previewtest::put32(placeable, 0x9AC6CDD7);
   previewtest::put16(placeable, 0);
-  for (int16_t v : {10, 20, 310, 120}) // left, top, right, bottom
+  for (int16_t v : {10, 20, 310, 120})  // left, top, right, bottom
     previewtest::put16(placeable, uint16_t(v));
   placeable.resize(22, 0);
   placeable.insert(placeable.end(), wmf.begin(), wmf.end());

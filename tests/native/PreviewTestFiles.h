@@ -15,7 +15,7 @@
 namespace previewtest {
 
 using Bytes = std::vector<uint8_t>;
-using Entry = std::pair<uint8_t, Bytes>; // code, bytes
+using Entry = std::pair<uint8_t, Bytes>;  // code, bytes
 
 inline void put16(Bytes &b, uint32_t v) {
   b.push_back(uint8_t(v));
@@ -26,12 +26,10 @@ inline void put32(Bytes &b, uint32_t v) {
   put16(b, v >> 16);
 }
 inline void set32(Bytes &b, size_t at, uint32_t v) {
-  for (int i = 0; i < 4; ++i)
-    b[at + i] = uint8_t(v >> (8 * i));
+  for (int i = 0; i < 4; ++i) b[at + i] = uint8_t(v >> (8 * i));
 }
 inline void putBe32(Bytes &b, uint32_t v) {
-  for (int i = 3; i >= 0; --i)
-    b.push_back(uint8_t(v >> (8 * i)));
+  for (int i = 3; i >= 0; --i) b.push_back(uint8_t(v >> (8 * i)));
 }
 
 constexpr uint8_t kSentinel[16] = {0x1F, 0x25, 0x6D, 0x07, 0xD4, 0x36, 0x28, 0x28,
@@ -47,8 +45,7 @@ inline Bytes buildDrawing(const std::vector<Entry> &entries, size_t padding = 25
   set32(file, 0x0D, uint32_t(kDirectoryAddress));
   file.insert(file.end(), kSentinel, kSentinel + 16);
   uint32_t overall = 1 + 9 * uint32_t(entries.size());
-  for (const Entry &entry : entries)
-    overall += uint32_t(entry.second.size());
+  for (const Entry &entry : entries) overall += uint32_t(entry.second.size());
   put32(file, overall);
   file.push_back(uint8_t(entries.size()));
   uint32_t start = uint32_t(file.size() + 9 * entries.size());
@@ -58,8 +55,7 @@ inline Bytes buildDrawing(const std::vector<Entry> &entries, size_t padding = 25
     put32(file, uint32_t(entry.second.size()));
     start += uint32_t(entry.second.size());
   }
-  for (const Entry &entry : entries)
-    file.insert(file.end(), entry.second.begin(), entry.second.end());
+  for (const Entry &entry : entries) file.insert(file.end(), entry.second.begin(), entry.second.end());
   file.insert(file.end(), kEndSentinel, kEndSentinel + 16);
   file.resize(file.size() + padding, 0);
   return file;
@@ -75,13 +71,11 @@ struct DibSpec {
   uint32_t colorsUsed = 0;
   uint32_t headerSize = 40;
   uint16_t planes = 1;
-  std::vector<uint32_t> palette; // 0x00RRGGBB, written as RGBQUAD
-  std::vector<uint32_t> masks;   // after a 40-byte header, or inside a longer one
+  std::vector<uint32_t> palette;  // 0x00RRGGBB, written as RGBQUAD
+  std::vector<uint32_t> masks;    // after a 40-byte header, or inside a longer one
 };
 
-inline size_t dibStride(const DibSpec &spec) {
-  return (size_t(spec.width < 0 ? 0 : spec.width) * spec.bitCount + 31) / 32 * 4;
-}
+inline size_t dibStride(const DibSpec &spec) { return (size_t(spec.width < 0 ? 0 : spec.width) * spec.bitCount + 31) / 32 * 4; }
 
 // Header, masks, palette, then the rows exactly as given (in file order).
 inline Bytes buildDib(const DibSpec &spec, const Bytes &rows) {
@@ -97,12 +91,9 @@ inline Bytes buildDib(const DibSpec &spec, const Bytes &rows) {
   put32(b, 2835);
   put32(b, spec.colorsUsed);
   put32(b, 0);
-  for (uint32_t mask : spec.masks)
-    put32(b, mask);
-  if (b.size() < spec.headerSize && spec.headerSize <= 124)
-    b.resize(spec.headerSize, 0);
-  for (uint32_t colour : spec.palette)
-    put32(b, colour & 0xFFFFFF);
+  for (uint32_t mask : spec.masks) put32(b, mask);
+  if (b.size() < spec.headerSize && spec.headerSize <= 124) b.resize(spec.headerSize, 0);
+  for (uint32_t colour : spec.palette) put32(b, colour & 0xFFFFFF);
   b.insert(b.end(), rows.begin(), rows.end());
   return b;
 }
@@ -127,8 +118,7 @@ inline uint32_t crc32(const uint8_t *data, size_t size, uint32_t crc = 0) {
   crc = ~crc;
   for (size_t i = 0; i < size; ++i) {
     crc ^= data[i];
-    for (int k = 0; k < 8; ++k)
-      crc = (crc >> 1) ^ (0xEDB88320u & (0u - (crc & 1)));
+    for (int k = 0; k < 8; ++k) crc = (crc >> 1) ^ (0xEDB88320u & (0u - (crc & 1)));
   }
   return ~crc;
 }
@@ -142,22 +132,19 @@ inline void putPngChunk(Bytes &png, const char *type, const Bytes &data) {
 }
 
 // An 8-bit PNG of colour(x, y): RGB from 0x00RRGGBB, or with alpha RGBA from 0xAARRGGBB.
-inline Bytes buildPng(uint32_t width, uint32_t height, const std::function<uint32_t(int, int)> &colour,
-                      bool alpha = false) {
+inline Bytes buildPng(uint32_t width, uint32_t height, const std::function<uint32_t(int, int)> &colour, bool alpha = false) {
   Bytes raw;
   for (uint32_t y = 0; y < height; ++y) {
-    raw.push_back(0); // filter: none
+    raw.push_back(0);  // filter: none
     for (uint32_t x = 0; x < width; ++x) {
       const uint32_t c = colour(int(x), int(y));
       raw.push_back(uint8_t(c >> 16)), raw.push_back(uint8_t(c >> 8)), raw.push_back(uint8_t(c));
-      if (alpha)
-        raw.push_back(uint8_t(c >> 24));
+      if (alpha) raw.push_back(uint8_t(c >> 24));
     }
   }
   Bytes z = {0x78, 0x01};
   uint32_t a = 1, b = 0;
-  for (uint8_t byte : raw)
-    a = (a + byte) % 65521, b = (b + a) % 65521;
+  for (uint8_t byte : raw) a = (a + byte) % 65521, b = (b + a) % 65521;
   for (size_t at = 0; at < raw.size() || at == 0; at += 65535) {
     const size_t n = std::min<size_t>(65535, raw.size() - at);
     z.push_back(at + n == raw.size() ? 1 : 0);
@@ -182,9 +169,9 @@ inline Bytes buildPng(uint32_t width, uint32_t height, const std::function<uint3
 // of the picture differs from a pure-colour background.
 inline uint32_t lineArt(int x, int y, int width, int height) {
   const bool frame = x < 2 || y < 2 || x >= width - 2 || y >= height - 2;
-  const bool diagonal = std::abs(x * height - y * width) < 2 * width ||
-                        std::abs((width - 1 - x) * height - y * width) < 2 * width;
+  const bool diagonal =
+      std::abs(x * height - y * width) < 2 * width || std::abs((width - 1 - x) * height - y * width) < 2 * width;
   return frame || diagonal ? 0xFFFFFF : 0x202830;
 }
 
-} // namespace previewtest
+}  // namespace previewtest

@@ -42,3 +42,14 @@ TEST(ComposeStartShellPath, PathsWithoutDriveGoThroughTheNetworkFolder) {
   EXPECT_EQ(Compose("\\\\server\\share\\dwg\\", ""), "Desktop\\My Network Places\\\\server\\share\\dwg\\");
 }
 }  // namespace
+
+namespace {
+TEST(FileBaseName, DropsFolderAndLastExtension) {
+  EXPECT_EQ(FileBaseName("plan.dwg"), "plan");
+  EXPECT_EQ(FileBaseName("C:\\Proj\\plan.dwg"), "plan");
+  EXPECT_EQ(FileBaseName("plan.dwg.old"), "plan.dwg");
+  EXPECT_EQ(FileBaseName("noext"), "noext");
+  EXPECT_EQ(FileBaseName(".dwg"), "");
+  EXPECT_EQ(FileBaseName("c:x.dwg"), "x");
+}
+}  // namespace

@@ -4,11 +4,14 @@
 #include "catalogue/Ombra3Doc.h"
 #include "catalogue/Ordering.h"
 #include "catalogue/StateFilePath.h"
+#include "catalogue/TextCompare.h"
 #include "CatalogueTestFolder.h"
 
 #include <gtest/gtest.h>
 
 #include <windows.h>
+
+#include <mbstring.h>
 
 #include <algorithm>
 #include <cstdio>
@@ -175,5 +178,19 @@ TEST_F(CatalogueScan, NamesSortInTheOrderOfTheirLowerCase) {
   SortRecords(*g_pCatalogue, kSortByName);
   EXPECT_EQ(CatalogueNames(), (std::vector<std::string>{"_x.dwg", "a.dwg", "b.dwg"}));
   EXPECT_TRUE(CompareByName(DwgData("_x.dwg", 0, 0), DwgData("A.dwg", 0, 0)));
+}
+
+int Sign(int value) { return (value > 0) - (value < 0); }
+
+TEST(CompareNoCase, AgreesWithTheRunTime) {
+  // ASCII takes a quicker path than the run time's comparison: both must order alike,
+  // also for the signs between "Z" and "a" and for bytes past ASCII.
+  const char *texts[] = {"", "a", "A", "b", "_", "[", "^", "`", "{", "~", "plan", "PLAN", "plan-a", "plan.dwg",
+                         "plan2", "Z", "z", "\xC4", "\xE4", "a\xC4", "a\xE4b", "\xFF"};
+  for (const char *a : texts)
+    for (const char *b : texts)
+      EXPECT_EQ(Sign(CompareNoCase(a, b)),
+                Sign(_mbsicmp(reinterpret_cast<const unsigned char *>(a), reinterpret_cast<const unsigned char *>(b))))
+          << '"' << a << "\" \"" << b << '"';
 }
 }  // namespace

@@ -16,8 +16,8 @@ using previewtest::Bytes;
 
 namespace {
 
-constexpr COLORREF kBackground = RGB(255, 0, 255); // in no picture of these tests
-constexpr uint32_t kBackgroundPixel = 0xFF00FF;      // the same colour as read from a 32-bit DIB
+constexpr COLORREF kBackground = RGB(255, 0, 255);  // in no picture of these tests
+constexpr uint32_t kBackgroundPixel = 0xFF00FF;     // the same colour as read from a 32-bit DIB
 
 std::wstring folderOf(const std::wstring &path) { return path.substr(0, path.find_last_of(L"\\/")); }
 
@@ -29,13 +29,12 @@ std::wstring fixtureFolder() {
   wchar_t self[MAX_PATH];
   GetModuleFileNameW(nullptr, self, MAX_PATH);
   for (std::wstring folder = folderOf(self); folder.size() > 3; folder = folderOf(folder))
-    if (exists(folder + L"\\CMakePresets.json"))
-      return folder + L"\\..\\shared\\fixtures\\dwg";
+    if (exists(folder + L"\\CMakePresets.json")) return folder + L"\\..\\shared\\fixtures\\dwg";
   return L"";
 }
 
 class TempFolder {
-public:
+ public:
   TempFolder() {
     wchar_t base[MAX_PATH];
     GetTempPathW(MAX_PATH, base);
@@ -43,8 +42,7 @@ public:
     CreateDirectoryW(m_path.c_str(), nullptr);
   }
   ~TempFolder() {
-    for (const std::wstring &file : m_files)
-      DeleteFileW(file.c_str());
+    for (const std::wstring &file : m_files) DeleteFileW(file.c_str());
     RemoveDirectoryW(m_path.c_str());
   }
   std::wstring write(const std::wstring &name, const Bytes &bytes) {
@@ -58,7 +56,7 @@ public:
   }
   const std::wstring &path() const { return m_path; }
 
-private:
+ private:
   std::wstring m_path;
   std::vector<std::wstring> m_files;
 };
@@ -66,22 +64,23 @@ private:
 // A bordered child window whose WM_PAINT asks the host for a preview, as a tile does, inside
 // a top-most frame of its own so that no other window hides it.
 class PreviewWindow {
-public:
+ public:
   PreviewWindow(int width, int height) {
     static const ATOM windowClass = [] {
       WNDCLASSW wc = {};
       wc.lpfnWndProc = &PreviewWindow::procedure;
       wc.hInstance = GetModuleHandleW(nullptr);
       wc.lpszClassName = L"LumvexPreviewTest";
-      return RegisterClassW(&wc); // no background brush: only the painter paints
+      return RegisterClassW(&wc);  // no background brush: only the painter paints
     }();
     static int nextLeft = 0;
     const int left = 10 + nextLeft % 800;
     nextLeft += width + 40;
-    m_frame = CreateWindowExW(WS_EX_TOOLWINDOW | WS_EX_TOPMOST, reinterpret_cast<LPCWSTR>(uintptr_t(windowClass)), L"", WS_POPUP | WS_VISIBLE,
-                              left, 10, width + 20, height + 20, nullptr, nullptr, GetModuleHandleW(nullptr), nullptr);
-    m_window = CreateWindowExW(0, reinterpret_cast<LPCWSTR>(uintptr_t(windowClass)), L"", WS_CHILD | WS_VISIBLE | WS_BORDER, 10, 10, width + 2,
-                               height + 2, m_frame, nullptr, GetModuleHandleW(nullptr), nullptr);
+    m_frame = CreateWindowExW(WS_EX_TOOLWINDOW | WS_EX_TOPMOST, reinterpret_cast<LPCWSTR>(uintptr_t(windowClass)), L"",
+                              WS_POPUP | WS_VISIBLE, left, 10, width + 20, height + 20, nullptr, nullptr,
+                              GetModuleHandleW(nullptr), nullptr);
+    m_window = CreateWindowExW(0, reinterpret_cast<LPCWSTR>(uintptr_t(windowClass)), L"", WS_CHILD | WS_VISIBLE | WS_BORDER, 10,
+                               10, width + 2, height + 2, m_frame, nullptr, GetModuleHandleW(nullptr), nullptr);
     SetWindowLongPtrW(m_window, GWLP_USERDATA, LONG_PTR(this));
     pumpMessages();
   }
@@ -118,8 +117,7 @@ public:
     GdiFlush();
     std::vector<uint32_t> result(static_cast<uint32_t *>(bits),
                                  static_cast<uint32_t *>(bits) + size_t(client.right) * client.bottom);
-    for (uint32_t &pixel : result)
-      pixel &= 0xFFFFFF;
+    for (uint32_t &pixel : result) pixel &= 0xFFFFFF;
     SelectObject(memoryDc, old);
     DeleteObject(section);
     DeleteDC(memoryDc);
@@ -130,7 +128,7 @@ public:
   int width() const { return clientRect().right; }
   int height() const { return clientRect().bottom; }
 
-private:
+ private:
   static LRESULT CALLBACK procedure(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
     auto *self = reinterpret_cast<PreviewWindow *>(GetWindowLongPtrW(window, GWLP_USERDATA));
     if (message == WM_PAINT && self) {
@@ -142,15 +140,13 @@ private:
       EndPaint(window, &paint);
       return 0;
     }
-    if (message == WM_ERASEBKGND)
-      return 1;
+    if (message == WM_ERASEBKGND) return 1;
     return DefWindowProcW(window, message, wParam, lParam);
   }
 
   static void pumpMessages() {
     MSG msg;
-    while (PeekMessageW(&msg, nullptr, 0, 0, PM_REMOVE))
-      DispatchMessageW(&msg);
+    while (PeekMessageW(&msg, nullptr, 0, 0, PM_REMOVE)) DispatchMessageW(&msg);
   }
 
   RECT clientRect() const {
@@ -201,8 +197,8 @@ void expectLetterbox(PreviewWindow &window, int pictureWidth, int pictureHeight)
   const PixelCount picture = countPixels(pixels, w, inside);
   EXPECT_GT(picture.other, 0u);
   EXPECT_LE(picture.background * 100, picture.other) << "the picture is not where it should be";
-  for (const Box &margin : {Box{0, 0, w, place.top - 2}, Box{0, place.bottom + 2, w, h},
-                            Box{0, 0, place.left - 2, h}, Box{place.right + 2, 0, w, h}})
+  for (const Box &margin :
+       {Box{0, 0, w, place.top - 2}, Box{0, place.bottom + 2, w, h}, Box{0, 0, place.left - 2, h}, Box{place.right + 2, 0, w, h}})
     EXPECT_EQ(countPixels(pixels, w, margin).other, 0u)
         << "margin " << margin.left << "," << margin.top << "-" << margin.right << "," << margin.bottom;
 }
@@ -265,22 +261,21 @@ Bytes windowsMetafile(int width, int height) {
 
 struct FixturePicture {
   const wchar_t *file;
-  int width, height; // 0: the drawing shows no picture
+  int width, height;  // 0: the drawing shows no picture
 };
 
 const FixturePicture kFixtures[] = {
-    {L"r14-example.dwg", 216, 140},    {L"r2000-arc.dwg", 256, 102},         {L"r2004-hatch.dwg", 184, 113},
-    {L"r2007-two-bitmaps.dwg", 256, 160}, {L"r2010-line.dwg", 256, 102},     {L"r2013-arc-png.dwg", 256, 102},
+    {L"r14-example.dwg", 216, 140},       {L"r2000-arc.dwg", 256, 102},     {L"r2004-hatch.dwg", 184, 113},
+    {L"r2007-two-bitmaps.dwg", 256, 160}, {L"r2010-line.dwg", 256, 102},    {L"r2013-arc-png.dwg", 256, 102},
     {L"r2013-leader-png.dwg", 591, 448},  {L"r2018-header-only.dwg", 0, 0}, {L"r2018-no-images.dwg", 0, 0},
     {L"r11-no-preview.dwg", 0, 0},
 };
 
-} // namespace
+}  // namespace
 
 TEST(PreviewPainter, EveryFixtureInWideAndTallWindows) {
   const std::wstring folder = fixtureFolder();
-  if (folder.empty() || !exists(folder))
-    GTEST_SKIP() << "no fixtures beside the repository";
+  if (folder.empty() || !exists(folder)) GTEST_SKIP() << "no fixtures beside the repository";
   PreviewWindow wide(360, 160), tall(150, 260);
   for (const FixturePicture &fixture : kFixtures) {
     SCOPED_TRACE(std::string(fixture.file, fixture.file + wcslen(fixture.file)));
@@ -299,6 +294,31 @@ TEST(PreviewPainter, EveryFixtureInWideAndTallWindows) {
   }
 }
 
+// Drawings added to the fixtures later are not in the table: each still shows a picture when
+// the painter says so, and the background alone when it does not.
+TEST(PreviewPainter, EveryOtherFileOfTheFixtureFolder) {
+  const std::wstring folder = fixtureFolder();
+  if (folder.empty() || !exists(folder)) GTEST_SKIP() << "no fixtures beside the repository";
+  PreviewWindow window(200, 200);
+  WIN32_FIND_DATAW found;
+  const HANDLE search = FindFirstFileW((folder + L"\\*").c_str(), &found);
+  ASSERT_NE(search, INVALID_HANDLE_VALUE);
+  do {
+    if (found.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY) continue;
+    bool known = false;
+    for (const FixturePicture &fixture : kFixtures) known = known || _wcsicmp(fixture.file, found.cFileName) == 0;
+    if (known) continue;
+    SCOPED_TRACE(std::string(found.cFileName, found.cFileName + wcslen(found.cFileName)));
+    if (window.show(folder + L"\\" + found.cFileName)) {
+      const auto pixels = window.pixels();
+      EXPECT_GT(countPixels(pixels, 200, {0, 0, 200, 200}).other, 0u);
+    } else {
+      expectBackgroundOnly(window);
+    }
+  } while (FindNextFileW(search, &found));
+  FindClose(search);
+}
+
 TEST(PreviewPainter, GeneratedPictureOfEachKind) {
   TempFolder temp;
   PreviewWindow window(300, 220);
@@ -315,7 +335,9 @@ TEST(PreviewPainter, GeneratedPictureOfEachKind) {
   expectLetterbox(window, 1, 2);
 
   // Half-transparent red over the magenta background.
-  EXPECT_TRUE(window.show(drawing(L"glass.dwg", 6, previewtest::buildPng(30, 22, [](int, int) { return 0x80FF0000u; }, true))));
+  EXPECT_TRUE(window.show(drawing(L"glass.dwg", 6,
+                                  previewtest::buildPng(
+                                      30, 22, [](int, int) { return 0x80FF0000u; }, true))));
   const uint32_t blended = pixelAt(window, 150, 110);
   EXPECT_NEAR(int(blended >> 16), 255, 3);
   EXPECT_NEAR(int(blended & 0xFF), 127, 3);
@@ -350,7 +372,7 @@ TEST(PreviewPainter, HostileOrMissingDrawingsLeaveTheBackground) {
   Bytes pastEnd = previewtest::buildDrawing({previewtest::headerData(), {2, lineArtDib(40, 30)}});
   previewtest::set32(pastEnd, previewtest::kDirectoryAddress + 21 + 9 + 5, 0x7FFFFFFF);
   Bytes pngBomb = lineArtPng(40, 30);
-  previewtest::set32(pngBomb, 16, 0x00A00000); // width 40960 and a bad checksum
+  previewtest::set32(pngBomb, 16, 0x00A00000);  // width 40960 and a bad checksum
   const std::vector<std::pair<const wchar_t *, Bytes>> files = {
       {L"huge.dwg", previewtest::buildDrawing({{2, previewtest::buildDib(huge, Bytes(64, 0))}})},
       {L"past-end.dwg", pastEnd},

@@ -222,10 +222,13 @@ struct DialogTemplate {
   std::vector<DialogItem> items;
 };
 
+// The system control classes by ordinal or by name, in any case, as the dialog manager takes them.
 std::wstring ClassName(const std::wstring &name) {
-  if (name == L"#128") return L"Button";
-  if (name == L"#129") return L"Edit";
-  if (name == L"#130") return L"Static";
+  for (const auto &[ordinal, known] : {std::pair<const wchar_t *, const wchar_t *>{L"#128", L"Button"},
+                                       {L"#129", L"Edit"},
+                                       {L"#130", L"Static"}}) {
+    if (name == ordinal || lstrcmpiW(name.c_str(), known) == 0) return known;
+  }
   return name;
 }
 

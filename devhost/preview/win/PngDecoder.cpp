@@ -28,19 +28,16 @@ struct ReleaseStream {
   void operator()(IStream *stream) const { stream->Release(); }
 };
 
-} // namespace
+}  // namespace
 
 bool decodePng(const uint8_t *data, size_t size, DecodedPicture &out) {
   out = DecodedPicture();
   uint32_t width = 0, height = 0;
-  if (!readPngSize(data, size, width, height) || size > UINT_MAX || !gdiplusStarted())
-    return false;
+  if (!readPngSize(data, size, width, height) || size > UINT_MAX || !gdiplusStarted()) return false;
   std::unique_ptr<IStream, ReleaseStream> stream(SHCreateMemStream(data, UINT(size)));
-  if (!stream)
-    return false;
+  if (!stream) return false;
   std::unique_ptr<Gdiplus::Bitmap> bitmap(Gdiplus::Bitmap::FromStream(stream.get()));
-  if (!bitmap || bitmap->GetLastStatus() != Gdiplus::Ok || bitmap->GetWidth() != width ||
-      bitmap->GetHeight() != height)
+  if (!bitmap || bitmap->GetLastStatus() != Gdiplus::Ok || bitmap->GetWidth() != width || bitmap->GetHeight() != height)
     return false;
 
   std::vector<uint32_t> pixels(size_t(width) * height);
@@ -52,8 +49,8 @@ bool decodePng(const uint8_t *data, size_t size, DecodedPicture &out) {
   locked.Scan0 = pixels.data();
   Gdiplus::Rect whole(0, 0, INT(width), INT(height));
   // The decoder writes straight into our buffer, already in the layout of a 32-bit DIB.
-  if (bitmap->LockBits(&whole, Gdiplus::ImageLockModeRead | Gdiplus::ImageLockModeUserInputBuf,
-                       PixelFormat32bppARGB, &locked) != Gdiplus::Ok)
+  if (bitmap->LockBits(&whole, Gdiplus::ImageLockModeRead | Gdiplus::ImageLockModeUserInputBuf, PixelFormat32bppARGB, &locked) !=
+      Gdiplus::Ok)
     return false;
   bitmap->UnlockBits(&locked);
 
@@ -68,4 +65,4 @@ bool decodePng(const uint8_t *data, size_t size, DecodedPicture &out) {
   return true;
 }
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

@@ -11,7 +11,7 @@
 namespace devhost::preview {
 
 class PreviewFile final : public PreviewSource {
-public:
+ public:
   // Null when the file cannot be opened.
   static std::unique_ptr<PreviewFile> open(const wchar_t *path);
   ~PreviewFile() override;
@@ -24,10 +24,10 @@ public:
   // Every byte read from any drawing since the process started: what a preview costs in I/O.
   static uint64_t totalBytesRead();
 
-private:
+ private:
   PreviewFile(HANDLE handle, uint64_t size) : m_handle(handle), m_size(size) {}
   HANDLE m_handle;
   uint64_t m_size;
 };
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

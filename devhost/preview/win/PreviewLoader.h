@@ -10,4 +10,4 @@ namespace devhost::preview {
 // drawing has none, or none that can be trusted.
 PreviewImage loadPreviewImage(PreviewSource &source);
 
-} // namespace devhost::preview
+}  // namespace devhost::preview

@@ -1,18 +1,20 @@
 // acdbDisplayPreviewFromDwg: paints a drawing's stored preview into a window, scaled to fit with
-// its aspect ratio kept and centred on the background colour.
+// its aspect ratio kept and centred on the background colour. Tiles paint on the one
+// user-interface thread, so the cache and the counters here take no locks.
 #include "host/HostApi.h"
 #include "preview/PreviewCache.h"
 #include "preview/PreviewFit.h"
 #include "preview/PreviewTestApi.h"
+#include "preview/win/GdiHandles.h"
 #include "preview/win/PreviewFile.h"
 #include "preview/win/PreviewImage.h"
 #include "preview/win/PreviewLoader.h"
+#include "preview/win/RasterPaint.h"
 
 #include <windows.h>
 
 #include <memory>
 #include <string>
-#include <vector>
 
 using namespace devhost::preview;
 
@@ -29,64 +31,15 @@ PreviewCache<PreviewImage> &previewCache() {
   return cache;
 }
 
-class WindowDc {
-public:
-  explicit WindowDc(HWND window) : m_window(window), m_dc(GetDC(window)) {}
-  ~WindowDc() {
-    if (m_dc)
-      ReleaseDC(m_window, m_dc);
-  }
-  WindowDc(const WindowDc &) = delete;
-  WindowDc &operator=(const WindowDc &) = delete;
-  HDC get() const { return m_dc; }
-
-private:
-  HWND m_window;
-  HDC m_dc;
-};
-
-// The painter changes clipping and the stretch mode; a window with its own DC keeps them.
-class SavedDcState {
-public:
-  explicit SavedDcState(HDC dc) : m_dc(dc), m_saved(SaveDC(dc)) {}
-  ~SavedDcState() {
-    if (m_saved)
-      RestoreDC(m_dc, m_saved);
-  }
-  SavedDcState(const SavedDcState &) = delete;
-  SavedDcState &operator=(const SavedDcState &) = delete;
-
-private:
-  HDC m_dc;
-  int m_saved;
-};
-
-class SolidBrush {
-public:
-  explicit SolidBrush(COLORREF colour) : m_brush(CreateSolidBrush(colour)) {}
-  ~SolidBrush() {
-    if (m_brush)
-      DeleteObject(m_brush);
-  }
-  SolidBrush(const SolidBrush &) = delete;
-  SolidBrush &operator=(const SolidBrush &) = delete;
-  HBRUSH get() const { return m_brush; }
-
-private:
-  HBRUSH m_brush;
-};
-
 // The cache key of the drawing: its full path (tiles pass names relative to the current folder)
 // in lower case, as file names are compared here, its size and its last-write time. False when
 // the file is not there.
 bool keyOf(const wchar_t *path, std::wstring &full, PreviewKey &key) {
   const DWORD length = GetFullPathNameW(path, 0, nullptr, nullptr);
-  if (length == 0)
-    return false;
+  if (length == 0) return false;
   full.assign(length, L'\0');
   const DWORD written = GetFullPathNameW(path, length, &full[0], nullptr);
-  if (written == 0 || written >= length)
-    return false;
+  if (written == 0 || written >= length) return false;
   full.resize(written);
   WIN32_FILE_ATTRIBUTE_DATA attributes;
   if (!GetFileAttributesExW(full.c_str(), GetFileExInfoStandard, &attributes) ||
@@ -102,57 +55,22 @@ bool keyOf(const wchar_t *path, std::wstring &full, PreviewKey &key) {
 std::shared_ptr<const PreviewImage> previewOf(const wchar_t *path) {
   std::wstring full;
   PreviewKey key;
-  if (path == nullptr || !keyOf(path, full, key))
-    return nullptr;
-  if (auto kept = previewCache().find(key))
-    return kept;
+  if (path == nullptr || !keyOf(path, full, key)) return nullptr;
+  if (auto kept = previewCache().find(key)) return kept;
   ++g_decodeCount;
-  auto image = std::make_shared<PreviewImage>();
-  if (auto file = PreviewFile::open(full.c_str()))
-    *image = loadPreviewImage(*file);
-  // Drawings without a picture are kept too: repainting them must not read the file again.
+  // A file that exists but cannot be opened now (another program holds it) is tried again on
+  // the next paint; a drawing without a picture is kept like any other, so that repainting it
+  // does not read the file again.
+  const auto file = PreviewFile::open(full.c_str());
+  if (!file) return nullptr;
+  auto image = std::make_shared<PreviewImage>(loadPreviewImage(*file));
   previewCache().store(key, image);
   return image;
 }
 
-// A picture with transparency is blended over the background here, since StretchDIBits copies.
-std::vector<uint32_t> blendOver(const DecodedPicture &picture, COLORREF background) {
-  const uint32_t backRed = GetRValue(background), backGreen = GetGValue(background),
-                 backBlue = GetBValue(background);
-  std::vector<uint32_t> blended(picture.pixels.size());
-  for (size_t i = 0; i < blended.size(); ++i) {
-    const uint32_t pixel = picture.pixels[i];
-    const uint32_t alpha = pixel >> 24;
-    auto mix = [alpha](uint32_t front, uint32_t back) { return (front * alpha + back * (255 - alpha) + 127) / 255; };
-    blended[i] = 0xFF000000u | mix((pixel >> 16) & 0xFF, backRed) << 16 | mix((pixel >> 8) & 0xFF, backGreen) << 8 |
-                 mix(pixel & 0xFF, backBlue);
-  }
-  return blended;
-}
-
-void paintRaster(HDC dc, const FitRect &fit, const DecodedPicture &picture, COLORREF background) {
-  std::vector<uint32_t> blended;
-  const uint32_t *pixels = picture.pixels.data();
-  if (picture.hasAlpha) {
-    blended = blendOver(picture, background);
-    pixels = blended.data();
-  }
-  BITMAPINFO info = {};
-  info.bmiHeader.biSize = sizeof info.bmiHeader;
-  info.bmiHeader.biWidth = LONG(picture.width);
-  info.bmiHeader.biHeight = -LONG(picture.height); // top row first
-  info.bmiHeader.biPlanes = 1;
-  info.bmiHeader.biBitCount = 32;
-  info.bmiHeader.biCompression = BI_RGB;
-  SetStretchBltMode(dc, HALFTONE);
-  SetBrushOrgEx(dc, 0, 0, nullptr);
-  StretchDIBits(dc, fit.left, fit.top, fit.width, fit.height, 0, 0, int(picture.width), int(picture.height), pixels,
-                &info, DIB_RGB_COLORS, SRCCOPY);
-}
-
 void paint(HDC dc, const RECT &client, COLORREF background, const PreviewImage *image) {
   SavedDcState saved(dc);
-  SolidBrush brush(background);
+  const GdiObject<HBRUSH> brush(CreateSolidBrush(background));
   const int32_t width = client.right - client.left, height = client.bottom - client.top;
   if (image == nullptr || !image->hasPicture()) {
     FillRect(dc, &client, brush.get());
@@ -176,29 +94,27 @@ void paint(HDC dc, const RECT &client, COLORREF background, const PreviewImage *
     FillRect(dc, &picture, brush.get());
     PlayEnhMetaFile(dc, image->metafile.get(), &picture);
   } else {
-    paintRaster(dc, fit, image->raster, background);
+    paintRaster(dc, fit, *image, background);
   }
 }
 
-} // namespace
+}  // namespace
 
 extern "C" bool acdbDisplayPreviewFromDwg(const ACHAR *path, void *window, const uint32_t *background) {
   try {
     const HWND target = static_cast<HWND>(window);
-    if (target == nullptr || !IsWindow(target))
-      return false;
+    if (target == nullptr || !IsWindow(target)) return false;
     // Only the colour: the top byte of a COLORREF would select palette colours instead.
     const COLORREF colour = background ? COLORREF(*background & 0x00FFFFFF) : RGB(0, 0, 0);
     const auto image = previewOf(path);
     WindowDc dc(target);
-    if (dc.get() == nullptr)
-      return false;
+    if (dc.get() == nullptr) return false;
     RECT client;
     GetClientRect(target, &client);
     paint(dc.get(), client, colour, image.get());
     return image && image->hasPicture();
   } catch (...) {
-    return false; // out of memory: nothing painted, nothing thrown into the caller's paint handler
+    return false;  // out of memory: nothing painted, nothing thrown into the caller's paint handler
   }
 }
 

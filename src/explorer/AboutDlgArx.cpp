@@ -1,0 +1,5 @@
+#include "explorer/AboutDlgArx.h"
+
+#include "res/resource.h"
+
+CAboutDlgArx::CAboutDlgArx() : CDialog(IDD_ABOUTBOX) {}

@@ -1,0 +1,9 @@
+// The about box: icon and name of the module.
+#pragma once
+
+#include "fw/Dialog.h"
+
+class CAboutDlgArx : public fw::CDialog {
+public:
+  CAboutDlgArx();
+};

@@ -1,0 +1,3 @@
+#include "thumbs/FocusedEdit.h"
+
+fw::CEdit *g_pFocusedEdit = nullptr;

@@ -1,0 +1,248 @@
+// The file list on the real OLE clipboard: the view's copy read back by another process, and
+// paste of lists written as this program and as the Windows shell write them.
+#include "filecmd/ForFileCommands.h"
+#include "filecmd/SelectionCommands.h"
+#include "fw/SharedFile.h"
+
+#include <gtest/gtest.h>
+#include <ole2.h>
+#include <shlobj.h>
+
+#include <cstring>
+#include <filesystem>
+#include <fstream>
+#include <string>
+#include <vector>
+
+namespace {
+namespace fs = std::filesystem;
+
+class OleEnvironment : public ::testing::Environment {
+public:
+  void SetUp() override { ASSERT_TRUE(SUCCEEDED(OleInitialize(nullptr))); }
+  void TearDown() override { OleUninitialize(); }
+};
+const auto *const oleEnvironment = ::testing::AddGlobalTestEnvironment(new OleEnvironment);
+
+class ScratchFolder {
+public:
+  explicit ScratchFolder(const char *tag)
+      : m_path(fs::temp_directory_path() / (std::string(tag) + "-" + std::to_string(GetTickCount64()))) {
+    fs::create_directories(m_path);
+  }
+  ~ScratchFolder() {
+    std::error_code ignored;
+    fs::remove_all(m_path, ignored);
+  }
+  std::string Path() const { return m_path.string(); }
+  // Narrow names are ANSI text, as the module's paths are: kept off std::filesystem's own
+  // conversion.
+  std::string File(const std::string &name, const char *content = nullptr) const {
+    const std::string file = m_path.string() + "\\" + name;
+    if (content) std::ofstream(file.c_str(), std::ios::binary) << content;
+    return file;
+  }
+
+private:
+  fs::path m_path;
+};
+
+// Paste goes to the current directory, as after a folder scan.
+class CurrentDirectory {
+public:
+  explicit CurrentDirectory(const std::string &folder) : m_previous(fs::current_path()) { fs::current_path(folder); }
+  ~CurrentDirectory() { fs::current_path(m_previous); }
+
+private:
+  fs::path m_previous;
+};
+
+std::string Content(const std::string &path) {
+  std::ifstream in(path.c_str(), std::ios::binary);
+  return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
+}
+
+// Runs the reader program beside this one and returns what it printed.
+std::string ReadClipboardInAnotherProcess() {
+  SECURITY_ATTRIBUTES inherit{sizeof inherit, nullptr, TRUE};
+  HANDLE readEnd = nullptr, writeEnd = nullptr;
+  if (!CreatePipe(&readEnd, &writeEnd, &inherit, 0)) return "no pipe";
+  SetHandleInformation(readEnd, HANDLE_FLAG_INHERIT, 0);
+  STARTUPINFOA startup{};
+  startup.cb = sizeof startup;
+  startup.dwFlags = STARTF_USESTDHANDLES;
+  startup.hStdOutput = writeEnd;
+  startup.hStdError = writeEnd;
+  PROCESS_INFORMATION process{};
+  char exe[MAX_PATH] = "";
+  GetModuleFileNameA(nullptr, exe, MAX_PATH);
+  std::string reader = exe;
+  reader = reader.substr(0, reader.find_last_of('\\') + 1) + "ClipboardTestReader.exe";
+  std::string commandLine = "\"" + reader + "\"";
+  const BOOL started =
+      CreateProcessA(reader.c_str(), commandLine.data(), nullptr, nullptr, TRUE, 0, nullptr, nullptr, &startup, &process);
+  CloseHandle(writeEnd);
+  std::string output;
+  if (started) {
+    char buffer[512];
+    DWORD got = 0;
+    while (ReadFile(readEnd, buffer, sizeof buffer, &got, nullptr) && got) output.append(buffer, got);
+    WaitForSingleObject(process.hProcess, 10000);
+    CloseHandle(process.hThread);
+    CloseHandle(process.hProcess);
+  } else {
+    output = "reader did not start";
+  }
+  CloseHandle(readEnd);
+  std::string lines;
+  for (char c : output) {
+    if (c != '\r') lines.push_back(c);
+  }
+  return lines;
+}
+
+// Puts a file-list block on the clipboard with the plain clipboard calls, as other programs do.
+void PutOnClipboard(UINT format, const std::string &bytes) {
+  HWND owner = CreateWindowA("STATIC", "", 0, 0, 0, 0, 0, nullptr, nullptr, nullptr, nullptr);
+  ASSERT_NE(owner, nullptr);
+  ASSERT_TRUE(OpenClipboard(owner));
+  EmptyClipboard();
+  HGLOBAL block = GlobalAlloc(GMEM_MOVEABLE, bytes.size());
+  std::memcpy(GlobalLock(block), bytes.data(), bytes.size());
+  GlobalUnlock(block);
+  EXPECT_NE(SetClipboardData(format, block), nullptr);
+  CloseClipboard();
+  DestroyWindow(owner);
+}
+
+std::string Header(uint32_t offset, uint32_t wide) {
+  DROPFILES header{};
+  header.pFiles = offset;
+  header.fWide = wide;
+  return std::string(reinterpret_cast<const char *>(&header), sizeof header);
+}
+
+std::string NarrowList(const std::vector<std::string> &paths) {
+  std::string block = Header(sizeof(DROPFILES), 0);
+  for (const std::string &path : paths) block += path + '\0';
+  return block + '\0';
+}
+
+std::string WideList(const std::vector<std::wstring> &paths) {
+  std::wstring list;
+  for (const std::wstring &path : paths) list += path + L'\0';
+  list += L'\0';
+  return Header(sizeof(DROPFILES), 1) + std::string(reinterpret_cast<const char *>(list.data()), list.size() * 2);
+}
+
+DwgCatalogue Catalogue(std::initializer_list<const char *> names) {
+  DwgCatalogue catalogue;
+  for (const char *name : names) catalogue.Add(DwgData(name, 0, 0));
+  return catalogue;
+}
+
+TEST(ClipboardBlock, SharedFileGrowsInWholeStepsOfZeroedMemory) {
+  fw::CSharedFile file;
+  const std::string header = Header(20, 0);
+  ASSERT_TRUE(file.Write(header.data(), header.size()));
+  const std::string longPath(5000, 'p');
+  ASSERT_TRUE(file.Write(longPath.data(), longPath.size()));
+  EXPECT_EQ(file.GetLength(), 5020u);
+  const fw::CGlobalMemory block = file.Detach();
+  EXPECT_EQ(file.GetLength(), 0u);
+  ASSERT_NE(block, nullptr);
+  const fw::CGlobalLock lock(block.get());
+  ASSERT_NE(lock.Data(), nullptr);
+  ASSERT_EQ(lock.Size(), 8192u);
+  const std::string bytes(static_cast<const char *>(lock.Data()), lock.Size());
+  EXPECT_EQ(bytes, header + longPath + std::string(8192 - 5020, '\0'));
+}
+
+TEST(ClipboardCopy, MarkedDrawingsAreReadBackByAnotherProcess) {
+  DwgCatalogue catalogue = Catalogue({"a.dwg", "b.dwg", "c.dwg"});
+  catalogue[0].Select();
+  catalogue[2].Select();
+  ASSERT_TRUE(CopySelected(catalogue, "C:\\Work"));
+  EXPECT_EQ(ReadClipboardInAnotherProcess(), "offset=20 wide=0\nC:\\Work\\a.dwg\nC:\\Work\\c.dwg\n");
+  EXPECT_TRUE(ForFileCommands().CanPaste());
+}
+
+TEST(ClipboardCopy, NothingMarkedLeavesAnEmptyListThatPastesNothing) {
+  ScratchFolder target("paste-target");
+  ASSERT_TRUE(CopySelected(Catalogue({"a.dwg"}), "C:\\Work\\"));
+  EXPECT_EQ(ReadClipboardInAnotherProcess(), "offset=20 wide=0\n");
+  CurrentDirectory here(target.Path());
+  EXPECT_FALSE(ForFileCommands().CanPaste());
+  EXPECT_FALSE(PasteFiles());
+  EXPECT_TRUE(fs::is_empty(target.Path()));
+}
+
+TEST(ClipboardCopy, CopiedDrawingsPasteIntoAnotherFolder) {
+  ScratchFolder source("copy-source"), target("copy-target");
+  source.File("a.dwg", "alpha");
+  source.File("b.dwg", "beta");
+  DwgCatalogue catalogue = Catalogue({"a.dwg", "b.dwg"});
+  catalogue[0].Select();
+  catalogue[1].Select();
+  ASSERT_TRUE(CopySelected(catalogue, source.Path()));
+  CurrentDirectory here(target.Path());
+  EXPECT_TRUE(PasteFiles());
+  EXPECT_EQ(Content(target.File("a.dwg")), "alpha");
+  EXPECT_EQ(Content(target.File("b.dwg")), "beta");
+  EXPECT_EQ(Content(source.File("a.dwg")), "alpha");
+}
+
+TEST(ClipboardPaste, ListOfOnlyNotesIsNotOfferedButStillPastes) {
+  ScratchFolder source("notes-source"), target("notes-target");
+  PutOnClipboard(CF_HDROP, NarrowList({source.File("notes.txt", "notes")}));
+  CurrentDirectory here(target.Path());
+  ForFileCommands commands;
+  EXPECT_FALSE(commands.CanPaste());
+  EXPECT_TRUE(commands.Paste());
+  EXPECT_EQ(Content(target.File("notes.txt")), "notes");
+}
+
+TEST(ClipboardPaste, DrawingInAnyCaseOffersPasteOfEveryFile) {
+  ScratchFolder source("mixed-source"), target("mixed-target");
+  PutOnClipboard(CF_HDROP, NarrowList({source.File("x.DWG", "x"), source.File("notes.txt", "notes")}));
+  CurrentDirectory here(target.Path());
+  ForFileCommands commands;
+  EXPECT_TRUE(commands.CanPaste());
+  EXPECT_TRUE(commands.Paste());
+  EXPECT_EQ(Content(target.File("x.DWG")), "x");
+  EXPECT_EQ(Content(target.File("notes.txt")), "notes");
+}
+
+TEST(ClipboardPaste, WideListFromTheShellIsReadAsAnsiPaths) {
+  ScratchFolder source("wide-source"), target("wide-target");
+  const std::string drawing = source.File("pl\xE4n.dwg", "plan");  // "plän.dwg" in code page 1252
+  const std::string notes = source.File("notes.txt", "notes");
+  ASSERT_EQ(GetACP(), 1252u);
+  const std::wstring wideFolder = fs::path(source.Path()).wstring();
+  PutOnClipboard(CF_HDROP, WideList({wideFolder + L"\\pl\u00e4n.dwg", wideFolder + L"\\notes.txt"}));
+  CurrentDirectory here(target.Path());
+  ForFileCommands commands;
+  EXPECT_TRUE(commands.CanPaste());
+  EXPECT_TRUE(commands.Paste());
+  EXPECT_EQ(Content(target.File("pl\xE4n.dwg")), "plan");
+  EXPECT_EQ(Content(target.File("notes.txt")), "notes");
+}
+
+TEST(ClipboardPaste, BrokenOrMissingListPastesNothing) {
+  ScratchFolder source("broken-source"), target("broken-target");
+  const std::string drawing = source.File("a.dwg", "a");
+  CurrentDirectory here(target.Path());
+  ForFileCommands commands;
+
+  std::string pastEnd = NarrowList({drawing});
+  pastEnd.replace(0, 4, Header(4096, 0).substr(0, 4));
+  PutOnClipboard(CF_HDROP, pastEnd);
+  EXPECT_FALSE(commands.CanPaste());
+  EXPECT_FALSE(commands.Paste());
+
+  PutOnClipboard(CF_TEXT, drawing + '\0');
+  EXPECT_FALSE(commands.CanPaste());
+  EXPECT_FALSE(commands.Paste());
+  EXPECT_TRUE(fs::is_empty(target.Path()));
+}
+}  // namespace

@@ -1,0 +1,187 @@
+// Delete to the recycle bin and rename, through the real shell: its confirmation is answered
+// by a watcher that finds the dialog and presses a button, as a person would.
+#include "filecmd/ForFileCommands.h"
+#include "filecmd/SelectionCommands.h"
+#include "filecmd/ShellFileOp.h"
+
+#include <gtest/gtest.h>
+
+#include <atomic>
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <string>
+#include <thread>
+
+namespace {
+namespace fs = std::filesystem;
+
+class ScratchFolder {
+public:
+  ScratchFolder() : m_path(fs::temp_directory_path() / ("filecmd-" + std::to_string(GetTickCount64()))) {
+    fs::create_directories(m_path);
+  }
+  ~ScratchFolder() {
+    std::error_code ignored;
+    fs::remove_all(m_path, ignored);
+  }
+  std::string Path() const { return m_path.string(); }
+  std::string File(const std::string &name, const char *content = nullptr) const {
+    const fs::path file = m_path / name;
+    if (content) std::ofstream(file, std::ios::binary) << content;
+    return file.string();
+  }
+
+private:
+  fs::path m_path;
+};
+
+std::string Content(const std::string &path) {
+  std::ifstream in(path, std::ios::binary);
+  return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
+}
+
+// The XDG trash the shell moves deleted files to, seen through drive Z:.
+fs::path TrashFiles() {
+  std::string data;
+  if (const char *xdg = std::getenv("XDG_DATA_HOME"); xdg && *xdg) {
+    data = std::string("Z:") + xdg;
+  } else {
+    std::string home = std::getenv("WINEHOMEDIR") ? std::getenv("WINEHOMEDIR") : "";
+    if (home.rfind("\\??\\", 0) == 0) home.erase(0, 4);
+    data = home + "\\.local\\share";
+  }
+  for (char &c : data) c = c == '/' ? '\\' : c;
+  return fs::path(data) / "Trash" / "files";
+}
+
+void RemoveFromTrash(const std::string &name) {
+  std::error_code ignored;
+  fs::remove(TrashFiles() / name, ignored);
+  fs::remove(TrashFiles().parent_path() / "info" / (name + ".trashinfo"), ignored);
+}
+
+// Waits on its own thread for a dialog of this process that has the button, and presses it.
+class DialogAnswerer {
+public:
+  explicit DialogAnswerer(int buttonId) : m_nButton(buttonId), m_thread([this] { Watch(); }) {}
+  ~DialogAnswerer() { Caption(); }
+  DialogAnswerer(const DialogAnswerer &) = delete;
+  DialogAnswerer &operator=(const DialogAnswerer &) = delete;
+
+  // Caption of the dialog answered, empty while none was.
+  std::string Caption() {
+    m_bStop = true;
+    if (m_thread.joinable()) m_thread.join();
+    return m_caption;
+  }
+
+private:
+  struct Search {
+    int button;
+    HWND found;
+  };
+
+  static BOOL CALLBACK Match(HWND window, LPARAM param) {
+    auto *search = reinterpret_cast<Search *>(param);
+    DWORD process = 0;
+    GetWindowThreadProcessId(window, &process);
+    char className[32] = "";
+    GetClassNameA(window, className, sizeof className);
+    if (process != GetCurrentProcessId() || std::string(className) != "#32770" || !IsWindowVisible(window) ||
+        !GetDlgItem(window, search->button))
+      return TRUE;
+    search->found = window;
+    return FALSE;
+  }
+
+  void Watch() {
+    for (int tries = 0; tries < 300 && !m_bStop; ++tries) {
+      Search search{m_nButton, nullptr};
+      EnumWindows(Match, reinterpret_cast<LPARAM>(&search));
+      if (search.found) {
+        char caption[256] = "";
+        GetWindowTextA(search.found, caption, sizeof caption);
+        m_caption = caption;
+        SendMessageA(GetDlgItem(search.found, m_nButton), BM_CLICK, 0, 0);
+        return;
+      }
+      Sleep(50);
+    }
+  }
+
+  int m_nButton;
+  std::string m_caption;
+  std::atomic<bool> m_bStop{false};
+  std::thread m_thread;
+};
+
+constexpr int kYes = 6;
+constexpr int kNo = 7;
+
+DwgCatalogue Catalogue(std::initializer_list<const char *> names) {
+  DwgCatalogue catalogue;
+  for (const char *name : names) catalogue.Add(DwgData(name, 0, 0));
+  return catalogue;
+}
+
+TEST(FileCommandDelete, ConfirmedDeleteMovesTheMarkedDrawingToTheTrash) {
+  ScratchFolder folder;
+  const std::string name = "gone-" + std::to_string(GetTickCount64()) + ".dwg";
+  folder.File(name, "drawing");
+  folder.File("kept.dwg", "other");
+  DwgCatalogue catalogue = Catalogue({"kept.dwg", name.c_str()});
+  catalogue[1].Select();
+
+  DialogAnswerer yes(kYes);
+  EXPECT_EQ(DeleteSelected(catalogue, folder.Path()), 0);
+  EXPECT_EQ(yes.Caption(), "Confirm file deletion");
+  EXPECT_FALSE(fs::exists(folder.File(name)));
+  EXPECT_TRUE(fs::exists(folder.File("kept.dwg")));
+  EXPECT_TRUE(fs::exists(TrashFiles() / name)) << (TrashFiles() / name).string();
+  EXPECT_EQ(Content((TrashFiles() / name).string()), "drawing");
+  RemoveFromTrash(name);
+}
+
+TEST(FileCommandDelete, AnsweringNoKeepsTheFileAndSetsTheAbortedFlag) {
+  ScratchFolder folder;
+  const std::string path = folder.File("plan.dwg", "plan");
+  CShellFileOp operation;
+  operation.AddFile(0, path.c_str());
+  DialogAnswerer no(kNo);
+  EXPECT_EQ(operation.DeleteFiles(), 0);
+  EXPECT_EQ(no.Caption(), "Confirm file deletion");
+  EXPECT_TRUE(operation.AnyOperationsAborted());
+  EXPECT_EQ(Content(path), "plan");
+}
+
+TEST(FileCommandDelete, NothingMarkedDeletesNothingAndAsksNothing) {
+  ScratchFolder folder;
+  folder.File("a.dwg", "a");
+  const DwgCatalogue catalogue = Catalogue({"a.dwg"});
+  DialogAnswerer yes(kYes);
+  EXPECT_NE(DeleteSelected(catalogue, folder.Path() + "\\"), 0);
+  EXPECT_EQ(yes.Caption(), "");
+  EXPECT_TRUE(fs::exists(folder.File("a.dwg")));
+}
+
+TEST(FileCommandRename, RenameToAFreeName) {
+  ScratchFolder folder;
+  const std::string from = folder.File("plan.dwg", "plan");
+  const std::string to = folder.File("plan2.dwg");
+  EXPECT_EQ(ForFileCommands().RenameFile(from.c_str(), to.c_str(), nullptr), 0);
+  EXPECT_FALSE(fs::exists(from));
+  EXPECT_EQ(Content(to), "plan");
+}
+
+TEST(FileCommandRename, RenameOntoATakenNameIsRefusedAndLosesNothing) {
+  ScratchFolder folder;
+  const std::string from = folder.File("plan.dwg", "plan");
+  const std::string to = folder.File("site.dwg", "site");
+  DialogAnswerer yes(kYes);
+  EXPECT_NE(ForFileCommands().RenameFile(from.c_str(), to.c_str(), nullptr), 0);
+  EXPECT_EQ(yes.Caption(), "");
+  EXPECT_EQ(Content(from), "plan");
+  EXPECT_EQ(Content(to), "site");
+}
+}  // namespace

@@ -1,0 +1,447 @@
+// The framework's controls on real windows: messages pass through the object before the
+// control's own procedure, notifications come back to the control's object, tool bars and the
+// status bar built from resources, pop-up menus that return the choice.
+#include "fw/Controls.h"
+#include "fw/Menu.h"
+#include "fw/StatusBar.h"
+#include "fw/ToolBar.h"
+#include "fw/FrameWnd.h"
+#include "fw/WinApp.h"
+#include "FwTestWindows.h"
+
+#include <gtest/gtest.h>
+
+#include <commctrl.h>
+
+#include <string>
+#include <vector>
+
+namespace {
+using fwtest::Log;
+using fwtest::Pump;
+
+std::string NotificationName(UINT code) {
+  switch (code) {
+  case EN_CHANGE: return "EN_CHANGE";
+  case STN_CLICKED: return "STN_CLICKED";
+  case TVN_SELCHANGINGA:
+  case TVN_SELCHANGINGW: return "TVN_SELCHANGING";
+  case TVN_SELCHANGEDA:
+  case TVN_SELCHANGEDW: return "TVN_SELCHANGED";
+  case TVN_ITEMEXPANDINGA:
+  case TVN_ITEMEXPANDINGW: return "TVN_ITEMEXPANDING";
+  case TVN_ITEMEXPANDEDA:
+  case TVN_ITEMEXPANDEDW: return "TVN_ITEMEXPANDED";
+  default: return {};
+  }
+}
+
+// The parent: records what command routing and the bars' prompts bring to it.
+class Parent : public fwtest::TopWindow {
+public:
+  BOOL OnCmdMsg(UINT id, int code, fw::CCmdUI *cmdUI) override {
+    if (code == fw::CN_UPDATE_COMMAND_UI) {
+      for (UINT disabled : disabledCommands)
+        if (id == disabled) {
+          cmdUI->Enable(FALSE);
+          return TRUE;
+        }
+      return FALSE;
+    }
+    const std::string name = NotificationName(static_cast<UINT>(code));
+    if (!name.empty()) log.push_back("parent " + name);
+    return FALSE;
+  }
+  LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override {
+    if (message == fw::WM_SETMESSAGESTRING) {
+      log.push_back("prompt " + std::to_string(wParam));
+      return 0;
+    }
+    return TopWindow::WindowProc(message, wParam, lParam);
+  }
+
+  Log log;
+  std::vector<UINT> disabledCommands;
+};
+
+class Edit : public fw::CEdit {
+public:
+  explicit Edit(Log &log) : m_log(log) {}
+  LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override {
+    if (m_log.empty() && !firstMessage) firstMessage = message;
+    if (message == WM_SETTEXT) m_log.push_back("edit WindowProc WM_SETTEXT");
+    return CEdit::WindowProc(message, wParam, lParam);
+  }
+  BOOL OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, LRESULT *result) override {
+    if (message == WM_COMMAND && HIWORD(wParam) == EN_CHANGE) {
+      m_log.push_back("edit " + NotificationName(EN_CHANGE));
+      return takesNotifications;
+    }
+    if (message == WM_CTLCOLOREDIT && brush) {
+      m_log.push_back("edit WM_CTLCOLOREDIT");
+      SetBkColor(reinterpret_cast<HDC>(wParam), kColour);
+      *result = reinterpret_cast<LRESULT>(brush);
+      return TRUE;
+    }
+    return CEdit::OnChildNotify(message, wParam, lParam, result);
+  }
+
+  static constexpr COLORREF kColour = RGB(0, 128, 255);
+  UINT firstMessage = 0;
+  bool takesNotifications = true;
+  HBRUSH brush = nullptr;
+
+private:
+  Log &m_log;
+};
+
+TEST(FwEditTest, MessagesPassThroughTheObjectAndNotificationsComeBackToIt) {
+  Parent parent;
+  ASSERT_TRUE(parent.Create());
+  Edit edit(parent.log);
+  ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE | ES_AUTOHSCROLL, RECT{10, 10, 210, 40}, &parent, 101));
+  EXPECT_EQ(static_cast<UINT>(WM_NCCREATE), edit.firstMessage);
+
+  edit.SetWindowText("plan");
+  EXPECT_EQ("plan", edit.GetWindowText());  // the edit control's own procedure did its work
+  EXPECT_EQ((Log{"edit WindowProc WM_SETTEXT", "edit EN_CHANGE"}), parent.log);
+
+  // A control that leaves the notification alone lets the parent's command routing see it.
+  parent.log.clear();
+  edit.takesNotifications = false;
+  edit.SetSel(4, 4);
+  edit.SendMessage(WM_CHAR, 's', 1);
+  EXPECT_EQ("plans", edit.GetWindowText());
+  EXPECT_EQ((Log{"edit EN_CHANGE", "parent EN_CHANGE"}), parent.log);
+
+  edit.SetSel(1, 3, TRUE);
+  int start = 0, end = 0;
+  edit.GetSel(start, end);
+  EXPECT_EQ(1, start);
+  EXPECT_EQ(3, end);
+  edit.SetLimitText(4);
+  EXPECT_EQ(4u, edit.GetLimitText());
+}
+
+TEST(FwEditTest, TheControlObjectAnswersItsColourMessageWithItsBrush) {
+  Parent parent;
+  ASSERT_TRUE(parent.Create());
+  Edit edit(parent.log);
+  HBRUSH brush = CreateSolidBrush(Edit::kColour);
+  edit.brush = brush;
+  ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE, RECT{10, 10, 210, 40}, &parent, 102));
+  edit.Invalidate();
+  edit.UpdateWindow();
+  Pump();
+  ASSERT_FALSE(parent.log.empty());
+  EXPECT_EQ("edit WM_CTLCOLOREDIT", parent.log.back());
+  HDC dc = GetDC(edit);
+  EXPECT_EQ(Edit::kColour, GetPixel(dc, 150, 15));  // right of any caret, in the painted background
+  ReleaseDC(edit, dc);
+  edit.DestroyWindow();
+  DeleteObject(brush);
+}
+
+class Label : public fw::CStatic {
+public:
+  explicit Label(Log &log) : m_log(log) {}
+  BOOL OnChildNotify(UINT message, WPARAM wParam, LPARAM, LRESULT *) override {
+    if (message == WM_COMMAND) m_log.push_back("label " + NotificationName(HIWORD(wParam)));
+    return message == WM_COMMAND;
+  }
+
+private:
+  Log &m_log;
+};
+
+TEST(FwStaticTest, AClickOnANotifyingStaticReachesTheStaticObject) {
+  Parent parent;
+  ASSERT_TRUE(parent.Create());
+  Label label(parent.log);
+  ASSERT_TRUE(label.Create("Search:", WS_CHILD | WS_VISIBLE | SS_NOTIFY | SS_CENTERIMAGE, RECT{20, 20, 120, 44}, &parent));
+  EXPECT_EQ("Search:", label.GetWindowText());
+  fwtest::MouseTo(fwtest::ScreenPoint(label, 30, 10));
+  fwtest::MouseButton(true);
+  fwtest::MouseButton(false);
+  EXPECT_EQ((Log{"label STN_CLICKED"}), parent.log);
+}
+
+class Tree : public fw::CTreeCtrl {
+public:
+  explicit Tree(Log &log) : m_log(log) {}
+  BOOL OnChildNotify(UINT message, WPARAM, LPARAM lParam, LRESULT *result) override {
+    if (message != WM_NOTIFY) return FALSE;
+    const std::string name = NotificationName(reinterpret_cast<NMHDR *>(lParam)->code);
+    if (name.empty()) return FALSE;
+    m_log.push_back("tree " + name);
+    *result = 0;
+    return TRUE;
+  }
+
+private:
+  Log &m_log;
+};
+
+TEST(FwTreeCtrlTest, ItemsAndNotificationsReflectedToTheTree) {
+  Parent parent;
+  ASSERT_TRUE(parent.Create());
+  Tree tree(parent.log);
+  ASSERT_TRUE(tree.Create(WS_CHILD | WS_VISIBLE | TVS_HASBUTTONS | TVS_HASLINES | TVS_LINESATROOT,
+                          RECT{0, 0, 300, 300}, &parent, 0xE900));
+  const HTREEITEM root = tree.InsertItem("Desktop");
+  const HTREEITEM first = tree.InsertItem("My Computer", root);
+  const HTREEITEM second = tree.InsertItem("Documents", root);
+  ASSERT_TRUE(root && first && second);
+  tree.SetItemData(root, 7);
+
+  EXPECT_EQ(root, tree.GetRootItem());
+  EXPECT_EQ(first, tree.GetChildItem(root));
+  EXPECT_EQ(second, tree.GetNextSiblingItem(first));
+  EXPECT_EQ(nullptr, tree.GetNextSiblingItem(second));
+  EXPECT_EQ(root, tree.GetParentItem(second));
+  EXPECT_EQ("Documents", tree.GetItemText(second));
+  EXPECT_EQ(7u, tree.GetItemData(root));
+
+  tree.Expand(root, TVE_EXPAND);
+  tree.SelectItem(second);
+  tree.Select(first, TVGN_DROPHILITE);
+  EXPECT_EQ(second, tree.GetSelectedItem());
+  EXPECT_EQ(first, tree.GetDropHilightItem());
+  EXPECT_EQ((Log{"tree TVN_ITEMEXPANDING", "tree TVN_ITEMEXPANDED", "tree TVN_SELCHANGING", "tree TVN_SELCHANGED"}),
+            parent.log);
+
+  RECT text{};
+  ASSERT_TRUE(tree.GetItemRect(second, &text, TRUE));
+  RECT whole{};
+  ASSERT_TRUE(tree.GetItemRect(second, &whole, FALSE));
+  EXPECT_GT(text.right - text.left, 0);
+  EXPECT_GT(text.top, 0);  // below the root and the first child
+  EXPECT_LE(whole.left, text.left);
+}
+
+// Tool bars are built from this program's own resources.
+class ToolBarTest : public ::testing::Test {
+protected:
+  void SetUp() override {
+    fw::AfxSetResourceHandle(GetModuleHandleA(nullptr));
+    ASSERT_TRUE(parent.Create());
+    ASSERT_TRUE(bar.CreateEx(&parent, TBSTYLE_FLAT,
+                             WS_CHILD | WS_VISIBLE | fw::CBRS_TOP | fw::CBRS_GRIPPER | fw::CBRS_TOOLTIPS | fw::CBRS_FLYBY,
+                             RECT{0, 0, 0, 0}, AFX_IDW_TOOLBAR));
+    ASSERT_TRUE(bar.LoadToolBar(128));
+    height = bar.CalcFixedLayout(TRUE, TRUE).cy;
+    bar.MoveWindow(RECT{0, 0, 600, height});
+    Pump();
+  }
+
+  Parent parent;
+  fw::CToolBar bar;
+  int height = 0;
+};
+
+TEST_F(ToolBarTest, ButtonsAndSeparatorsComeFromTheResource) {
+  const std::vector<UINT> expected{32771, 0, 32774, 0, 32775, 0, 32782, 0, 32804, 32790, 32805};
+  ASSERT_EQ(static_cast<int>(expected.size()), bar.GetCount());
+  for (int i = 0; i < bar.GetCount(); ++i) {
+    UINT id = 0, style = 0;
+    int image = 0;
+    bar.GetButtonInfo(i, id, style, image);
+    EXPECT_EQ(expected[static_cast<size_t>(i)], id) << i;
+    EXPECT_EQ(id == 0, (style & TBSTYLE_SEP) != 0) << i;
+  }
+  EXPECT_EQ(9, bar.CommandToIndex(32790));
+  EXPECT_EQ(-1, bar.CommandToIndex(4711));
+  EXPECT_THROW(bar.GetItemID(11), std::out_of_range);
+
+  // Buttons are the 16 x 20 pictures with room for their edges.
+  RECT button{};
+  bar.GetItemRect(0, &button);
+  EXPECT_EQ(23, button.right - button.left);
+  EXPECT_EQ(27, button.bottom - button.top);
+  int pictureWidth = 0, pictureHeight = 0;
+  HIMAGELIST images = reinterpret_cast<HIMAGELIST>(bar.SendMessage(TB_GETIMAGELIST));
+  ASSERT_TRUE(ImageList_GetIconSize(images, &pictureWidth, &pictureHeight));
+  EXPECT_EQ(16, pictureWidth);
+  EXPECT_EQ(20, pictureHeight);
+  EXPECT_EQ(7, ImageList_GetImageCount(images));
+
+  // The frame's layout height covers the buttons and the bar's bottom edge; the gripper
+  // takes room at the left, outside the control's client area.
+  EXPECT_EQ(button.bottom + 2, height);
+  RECT client{};
+  bar.GetClientRect(&client);
+  EXPECT_EQ(600 - 7, client.right);
+  EXPECT_EQ(height - 2, client.bottom);
+  EXPECT_EQ(32767, bar.CalcFixedLayout(TRUE, TRUE).cx);
+}
+
+TEST_F(ToolBarTest, AWidenedSeparatorMakesRoomForAChildControl) {
+  const int index = bar.CommandToIndex(32790);
+  RECT before{};
+  bar.GetItemRect(index + 1, &before);
+  bar.SetButtonInfo(index, 32790, fw::TBBS_SEPARATOR, 125);
+
+  RECT slot{};
+  bar.GetItemRect(index, &slot);
+  EXPECT_EQ(125, slot.right - slot.left);
+  EXPECT_EQ(index, bar.CommandToIndex(32790));
+  RECT after{};
+  bar.GetItemRect(index + 1, &after);
+  EXPECT_EQ(slot.right, after.left);
+  EXPECT_GT(after.left, before.left);
+
+  fw::CEdit box;
+  ASSERT_TRUE(box.Create(WS_CHILD | WS_VISIBLE | ES_AUTOHSCROLL, slot, &bar, 32790));
+  RECT placed{};
+  box.GetWindowRect(&placed);
+  MapWindowPoints(nullptr, bar, reinterpret_cast<POINT *>(&placed), 2);
+  EXPECT_TRUE(EqualRect(&slot, &placed));
+}
+
+TEST_F(ToolBarTest, ToolTipsAreTheTextAfterTheNewline) {
+  const HWND tips = bar.GetToolTips();
+  ASSERT_NE(nullptr, tips);
+  // Asked as the tool tip control asks the tool bar for a button's text.
+  const auto ask = [&](UINT id) {
+    NMTTDISPINFOW info{};
+    info.hdr.hwndFrom = tips;
+    info.hdr.idFrom = id;
+    info.hdr.code = TTN_GETDISPINFOW;
+    SendMessageW(bar, WM_NOTIFY, id, reinterpret_cast<LPARAM>(&info));
+    return std::wstring(info.lpszText ? info.lpszText : L"");
+  };
+  EXPECT_EQ(L"Scroll to begin", ask(32771));
+  EXPECT_EQ(L"Increase", ask(32774));
+  EXPECT_EQ(L"", ask(32775));  // a prompt without a tip
+  EXPECT_EQ(L"", ask(32782));  // no string at all
+}
+
+TEST_F(ToolBarTest, PointingAtButtonsShowsTheirPromptsUntilThePointerLeaves) {
+  RECT first{}, second{};
+  bar.GetItemRect(0, &first);
+  bar.GetItemRect(2, &second);
+  fwtest::MouseTo(fwtest::ScreenPoint(bar, (first.left + first.right) / 2, (first.top + first.bottom) / 2));
+  fwtest::MouseTo(fwtest::ScreenPoint(bar, (first.left + first.right) / 2 + 1, (first.top + first.bottom) / 2));
+  fwtest::MouseTo(fwtest::ScreenPoint(bar, (second.left + second.right) / 2, (second.top + second.bottom) / 2));
+  fwtest::MouseTo(fwtest::ScreenPoint(parent, 300, 300));
+  Pump(600);  // leaving is noticed on the window system's mouse tracking timer
+  EXPECT_EQ((Log{"prompt 32771", "prompt 32774", "prompt " + std::to_string(AFX_IDS_IDLEMESSAGE)}), parent.log);
+}
+
+TEST_F(ToolBarTest, IdleUpdateRunsHandlersAndLeavesOtherButtonsAsTheyWere) {
+  bar.EnableButton(32771, FALSE);  // set directly, as the frame does for its accept button
+  parent.disabledCommands = {32774};
+  bar.OnUpdateCmdUI(&parent);
+  EXPECT_FALSE(bar.IsButtonEnabled(32771));
+  EXPECT_FALSE(bar.IsButtonEnabled(32774));
+  EXPECT_TRUE(bar.IsButtonEnabled(32775));
+}
+
+class StatusBarTest : public ::testing::Test {
+protected:
+  void SetUp() override {
+    fw::AfxSetResourceHandle(GetModuleHandleA(nullptr));
+    ASSERT_TRUE(parent.Create());
+    ASSERT_TRUE(bar.Create(&parent));
+    const UINT indicators[] = {ID_SEPARATOR, ID_INDICATOR_CAPS, ID_INDICATOR_NUM, ID_INDICATOR_SCRL};
+    ASSERT_TRUE(bar.SetIndicators(indicators, 4));
+    const int height = bar.CalcFixedLayout(TRUE, TRUE).cy;
+    bar.MoveWindow(RECT{0, 400 - height, 600, 400});
+  }
+  std::string Shown(int index) const {
+    char text[256] = "";
+    bar.SendMessage(SB_GETTEXTA, static_cast<WPARAM>(index), reinterpret_cast<LPARAM>(text));
+    return text;
+  }
+  static void SetToggles(bool caps, bool num, bool scroll) {
+    BYTE keys[256] = {};
+    GetKeyboardState(keys);
+    keys[VK_CAPITAL] = caps ? 1 : 0;
+    keys[VK_NUMLOCK] = num ? 1 : 0;
+    keys[VK_SCROLL] = scroll ? 1 : 0;
+    SetKeyboardState(keys);
+  }
+
+  Parent parent;
+  fw::CStatusBar bar;
+};
+
+TEST_F(StatusBarTest, PanesFollowTheIndicatorsAndCarryTheirTexts) {
+  ASSERT_EQ(4, bar.GetCount());
+  EXPECT_EQ(4, static_cast<int>(bar.SendMessage(SB_GETPARTS, 0, 0)));
+  EXPECT_EQ("CAP", bar.GetPaneText(1));     // not in this program's strings: the usual word
+  EXPECT_EQ("NUMLK", bar.GetPaneText(2));   // from the string table
+  EXPECT_EQ("SCRL", bar.GetPaneText(3));
+  EXPECT_EQ(2, bar.CommandToIndex(ID_INDICATOR_NUM));
+  EXPECT_THROW(bar.GetPaneText(4), std::out_of_range);
+
+  bar.SetPaneText(0, "Ready");
+  EXPECT_EQ("Ready", Shown(0));
+  bar.SetMessagePaneText("Scroll to begin");
+  EXPECT_EQ("Scroll to begin", Shown(0));
+  EXPECT_EQ("Scroll to begin", bar.GetPaneText(0));
+
+  // The message pane stretches; each indicator is as wide as its text needs.
+  int rights[4] = {};
+  bar.SendMessage(SB_GETPARTS, 4, reinterpret_cast<LPARAM>(rights));
+  EXPECT_GT(rights[0], 300);
+  EXPECT_LE(rights[3], 600);
+  HDC dc = GetDC(bar);
+  SelectObject(dc, GetStockObject(DEFAULT_GUI_FONT));
+  for (int i = 1; i < 4; ++i) {
+    const std::string text = bar.GetPaneText(i);
+    SIZE extent{};
+    GetTextExtentPoint32A(dc, text.c_str(), static_cast<int>(text.size()), &extent);
+    EXPECT_GT(rights[i] - rights[i - 1], extent.cx) << text;
+  }
+  ReleaseDC(bar, dc);
+}
+
+TEST_F(StatusBarTest, KeyIndicatorsShowOnlyWhileTheirKeyIsOn) {
+  SetToggles(true, false, false);
+  bar.OnUpdateCmdUI(&parent);
+  EXPECT_EQ("CAP", Shown(1));
+  EXPECT_EQ("", Shown(2));
+  EXPECT_EQ("", Shown(3));
+  EXPECT_EQ("NUMLK", bar.GetPaneText(2));  // kept while hidden
+
+  SetToggles(false, true, true);
+  bar.OnUpdateCmdUI(&parent);
+  EXPECT_EQ("", Shown(1));
+  EXPECT_EQ("NUMLK", Shown(2));
+  EXPECT_EQ("SCRL", Shown(3));
+
+  // An update handler of the frame decides instead of the key.
+  parent.disabledCommands = {ID_INDICATOR_NUM};
+  bar.OnUpdateCmdUI(&parent);
+  EXPECT_EQ("", Shown(2));
+  SetToggles(false, false, false);
+}
+
+TEST(FwMenuTest, APopUpFromTheResourcesReturnsTheChosenCommand) {
+  fw::AfxSetResourceHandle(GetModuleHandleA(nullptr));
+  Parent owner;
+  ASSERT_TRUE(owner.Create());
+  fw::CMenu menu;
+  ASSERT_TRUE(menu.LoadMenu(300));
+  HMENU popup = menu.GetSubMenu(0);
+  ASSERT_NE(nullptr, popup);
+  EXPECT_EQ(3, GetMenuItemCount(popup));
+
+  // The keys wait in the queue until the menu's own loop reads them.
+  owner.PostMessage(WM_KEYDOWN, VK_DOWN, 0);
+  owner.PostMessage(WM_KEYDOWN, VK_DOWN, 0);
+  owner.PostMessage(WM_KEYDOWN, VK_RETURN, 0);
+  EXPECT_EQ(2u, fw::CMenu::TrackPopup(popup, TPM_LEFTALIGN, 100, 100, owner));
+
+  fw::CMenu built;
+  ASSERT_TRUE(built.CreatePopupMenu());
+  built.AppendMenu(MF_STRING | MF_GRAYED, 1, "&Copy");
+  built.AppendMenu(MF_STRING, 4, "&Rename");
+  owner.PostMessage(WM_KEYDOWN, VK_ESCAPE, 0);
+  EXPECT_EQ(0u, built.TrackPopupMenu(TPM_LEFTALIGN, 100, 100, owner));
+  Pump();
+  EXPECT_TRUE(owner.log.empty());  // the choice is returned, never sent as a command
+}
+
+}  // namespace

@@ -1,0 +1,206 @@
+// The splitter on real windows: panes laid out from the column widths, the bar dragged with
+// the mouse, and views that tell their frame when they are clicked.
+#include "fw/SplitterWnd.h"
+#include "fw/FrameWnd.h"
+#include "FwTestWindows.h"
+
+#include <gtest/gtest.h>
+
+#include <memory>
+#include <string>
+
+namespace {
+using fwtest::Log;
+using fwtest::MouseButton;
+using fwtest::MouseTo;
+using fwtest::Pump;
+using fwtest::ScreenPoint;
+
+class Parent : public fwtest::TopWindow {
+public:
+  BOOL OnCmdMsg(UINT id, int code, fw::CCmdUI *) override {
+    if (code == fw::CN_COMMAND) log.push_back("command " + std::to_string(id));
+    return FALSE;
+  }
+  Log log;
+};
+
+RECT PaneRect(const fw::CSplitterWnd &splitter, int col) {
+  RECT rect{};
+  splitter.GetPane(0, col)->GetWindowRect(&rect);
+  MapWindowPoints(nullptr, splitter, reinterpret_cast<POINT *>(&rect), 2);
+  return rect;
+}
+
+int ColumnWidth(const fw::CSplitterWnd &splitter, int col) {
+  int cur = -1, min = -1;
+  splitter.GetColumnInfo(col, cur, min);
+  return cur;
+}
+
+class SplitterTest : public ::testing::Test {
+protected:
+  void SetUp() override {
+    ASSERT_TRUE(parent.Create(600, 400));
+    ASSERT_TRUE(splitter.CreateStatic(&parent, 1, 2));
+    ASSERT_TRUE(splitter.CreateView<fw::CView>(0, 0, SIZE{150, 100}));
+    ASSERT_TRUE(splitter.CreateView(0, 1, std::make_unique<fw::CView>(), SIZE{100, 100}));
+    splitter.MoveWindow(RECT{0, 0, 600, 400});
+    Pump();
+  }
+
+  Parent parent;
+  fw::CSplitterWnd splitter;
+};
+
+TEST_F(SplitterTest, PanesTakeTheirIdsAndTheIdealWidthOfTheFirstColumn) {
+  EXPECT_EQ(static_cast<int>(AFX_IDW_PANE_FIRST), splitter.GetDlgCtrlID());
+  EXPECT_EQ(0xE900, splitter.GetPane(0, 0)->GetDlgCtrlID());
+  EXPECT_EQ(0xE901, splitter.GetPane(0, 1)->GetDlgCtrlID());
+  EXPECT_FALSE(splitter.CreateView<fw::CView>(0, 1, SIZE{10, 10}));  // taken
+  EXPECT_THROW(splitter.GetPane(0, 2), std::out_of_range);
+
+  // A 2 pixel border around the panes and a 7 pixel bar between them.
+  const RECT left = PaneRect(splitter, 0);
+  const RECT right = PaneRect(splitter, 1);
+  EXPECT_EQ((RECT{2, 2, 152, 398}).right, left.right);
+  EXPECT_EQ(2, left.left);
+  EXPECT_EQ(2, left.top);
+  EXPECT_EQ(398, left.bottom);
+  EXPECT_EQ(159, right.left);
+  EXPECT_EQ(598, right.right);
+  EXPECT_EQ(150, ColumnWidth(splitter, 0));
+  EXPECT_EQ(439, ColumnWidth(splitter, 1));
+
+  splitter.SetColumnInfo(0, 250, 40);
+  splitter.RecalcLayout();
+  int cur = 0, min = 0;
+  splitter.GetColumnInfo(0, cur, min);
+  EXPECT_EQ(250, cur);
+  EXPECT_EQ(40, min);
+  EXPECT_EQ(252, PaneRect(splitter, 0).right);
+
+  // Below its minimum a column is hidden and the next one moves up to the border.
+  splitter.SetColumnInfo(0, 30, 40);
+  splitter.RecalcLayout();
+  EXPECT_EQ(0, ColumnWidth(splitter, 0));
+  EXPECT_FALSE(splitter.GetPane(0, 0)->IsWindowVisible());
+  EXPECT_EQ(9, PaneRect(splitter, 1).left);
+
+  // A first column wider than the window leaves nothing to the second.
+  splitter.SetColumnInfo(0, 5000, 0);
+  splitter.RecalcLayout();
+  EXPECT_EQ(596, ColumnWidth(splitter, 0));
+  EXPECT_EQ(0, ColumnWidth(splitter, 1));
+  EXPECT_FALSE(splitter.GetPane(0, 1)->IsWindowVisible());
+
+  // Resizing the splitter lays it out again.
+  splitter.SetColumnInfo(0, 150, 0);
+  splitter.MoveWindow(RECT{0, 0, 500, 300});
+  EXPECT_EQ(339, ColumnWidth(splitter, 1));
+  EXPECT_TRUE(splitter.GetPane(0, 1)->IsWindowVisible());
+}
+
+TEST_F(SplitterTest, DraggingTheBarWithTheMouseSetsTheFirstColumnsWidth) {
+  const POINT bar = ScreenPoint(splitter, 155, 200);
+  MouseTo(bar);
+  EXPECT_EQ(LoadCursor(nullptr, IDC_SIZEWE), GetCursor());
+
+  // While dragging, the splitter holds the mouse and shows an inverted track where the bar will go.
+  HDC dc = GetDC(parent);
+  const COLORREF before[2] = {GetPixel(dc, 215, 200), GetPixel(dc, 216, 200)};
+  MouseButton(true);
+  EXPECT_EQ(splitter.GetSafeHwnd(), GetCapture());
+  const POINT start = fwtest::CursorPosition();
+  MouseTo(POINT{bar.x + 60, bar.y + 30});
+  const int moved = fwtest::CursorPosition().x - start.x;  // 60, give or take the pointer's rounding
+  ASSERT_NEAR(60, moved, 1);
+  const COLORREF during[2] = {GetPixel(dc, 215, 200), GetPixel(dc, 216, 200)};
+  EXPECT_TRUE(before[0] != during[0] || before[1] != during[1]);
+  EXPECT_EQ(150, ColumnWidth(splitter, 0));  // nothing moves before the button is released
+  MouseButton(false);
+  ReleaseDC(parent, dc);
+
+  EXPECT_EQ(nullptr, GetCapture());
+  const int width = 150 + moved;
+  EXPECT_EQ(width, ColumnWidth(splitter, 0));
+  EXPECT_EQ(2 + width, PaneRect(splitter, 0).right);
+  EXPECT_EQ(2 + width + 7, PaneRect(splitter, 1).left);
+
+  // Escape during a drag leaves the width as it was.
+  MouseTo(ScreenPoint(splitter, 215, 100));
+  MouseButton(true);
+  MouseTo(ScreenPoint(splitter, 300, 100));
+  splitter.SendMessage(WM_KEYDOWN, VK_ESCAPE, 0);
+  MouseButton(false);
+  EXPECT_EQ(width, ColumnWidth(splitter, 0));
+
+  // The bar cannot be dragged past the end of the second pane, which then has no room left.
+  MouseTo(ScreenPoint(splitter, 2 + width + 3, 300));  // away from the last press: no double click
+  MouseButton(true);
+  MouseTo(ScreenPoint(splitter, 900, 300));
+  MouseButton(false);
+  EXPECT_EQ(596 - 7, ColumnWidth(splitter, 0));
+  EXPECT_EQ(0, ColumnWidth(splitter, 1));
+}
+
+TEST_F(SplitterTest, CommandsOfThePanesGoOnToTheSplittersParent) {
+  splitter.GetPane(0, 1)->SendMessage(WM_COMMAND, MAKEWPARAM(32771, 0), 0);
+  EXPECT_TRUE(parent.log.empty());  // a view keeps its own commands
+  splitter.SendMessage(WM_COMMAND, MAKEWPARAM(32771, 0), 0);
+  EXPECT_EQ((Log{"command 32771"}), parent.log);
+}
+
+// A view that records when its frame activates it.
+class ActivatedView : public fw::CView {
+public:
+  void OnActivateView(BOOL activate, CView *activateView, CView *deactiveView) override {
+    ++activations;
+    CView::OnActivateView(activate, activateView, deactiveView);
+  }
+  int activations = 0;
+};
+
+class Frame : public fw::CFrameWnd {
+public:
+  BOOL OnCreateClient(CREATESTRUCTA *) override {
+    return splitter.CreateStatic(this, 1, 2) && splitter.CreateView<ActivatedView>(0, 0, SIZE{150, 100}) &&
+           splitter.CreateView<ActivatedView>(0, 1, SIZE{100, 100});
+  }
+  fw::CSplitterWnd splitter;
+};
+
+TEST(FwViewTest, AClickedViewBecomesItsFramesActiveView) {
+  auto *frame = new Frame;  // a frame deletes itself when its window is gone
+  ASSERT_TRUE(frame->CreateEx(0, nullptr, "frame", WS_POPUP | WS_VISIBLE, RECT{40, 40, 640, 440},
+                              static_cast<HWND>(nullptr), 0));
+  SetWindowPos(*frame, HWND_TOPMOST, 0, 0, 0, 0, SWP_NOMOVE | SWP_NOSIZE);
+  SetForegroundWindow(*frame);
+  Pump();
+  fw::CWnd *left = frame->splitter.GetPane(0, 0);
+  fw::CWnd *right = frame->splitter.GetPane(0, 1);
+  EXPECT_EQ(frame, static_cast<fw::CView *>(right)->GetParentFrame());
+
+  MouseTo(ScreenPoint(*right, 50, 50));
+  MouseButton(true);
+  MouseButton(false);
+  EXPECT_EQ(right, frame->GetActiveView());
+  MouseTo(ScreenPoint(*left, 50, 50));
+  MouseButton(true);
+  MouseButton(false);
+  EXPECT_EQ(left, frame->GetActiveView());
+
+  // The active view clicked again after the focus went elsewhere takes the focus back itself.
+  SetFocus(frame->splitter);
+  const int before = static_cast<ActivatedView *>(left)->activations;
+  MouseButton(true);
+  MouseButton(false);
+  EXPECT_EQ(before + 1, static_cast<ActivatedView *>(left)->activations);
+
+  // A view going away leaves no active view behind.
+  left->DestroyWindow();
+  EXPECT_EQ(nullptr, frame->GetActiveView());
+  frame->DestroyWindow();
+}
+
+}  // namespace
