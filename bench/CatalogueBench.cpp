@@ -104,6 +104,10 @@ void BenchScan() {
     taken = g_pCatalogue->GetSize();
   }
   std::fprintf(stderr, "listed %d entries, %d drawings taken\n", listed, taken);
+  if (listed < kEntries || taken == 0) {
+    std::fprintf(stderr, "%s could not be listed in full: no figures\n", kMixedFolder);
+    std::exit(1);
+  }
   std::printf("scan_100k_ms %.1f ms\n", bestScan);
   std::printf("plain_loop_100k_ms %.1f ms\n", bestPlain);
   std::printf("scan_ratio_100k %.2f x\n", bestScan / bestPlain);

@@ -3,6 +3,7 @@
 #include "catalogue/TextCompare.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <numeric>
 #include <utility>
 #include <vector>
@@ -30,6 +31,49 @@ void ApplyOrder(DwgData *records, std::vector<int> &order) {
     order[at] = at;
   }
 }
+
+// Sorting by name reaches every name through its record, two scattered reads per side of each
+// comparison, which made it six times slower than by date. The sort works on a compact table
+// instead, in which the first 16 bytes of each name, folded as CompareNoCase folds ASCII,
+// decide most comparisons. Where they are equal, or a name has a byte past ASCII among them,
+// the names themselves are compared, so the order is CompareByName's exactly.
+struct NameKey {
+  uint64_t head;  // bytes 0-7, big-endian, zero past the end of the name
+  uint64_t tail;  // bytes 8-15
+  bool ascii;     // the key bytes are ASCII, folded
+  const char *name;
+  int index;
+};
+
+NameKey MakeNameKey(const std::string &name, int index) {
+  NameKey key{0, 0, true, name.c_str(), index};
+  for (size_t i = 0; i < 16; ++i) {
+    const unsigned char c = i < name.size() ? static_cast<unsigned char>(name[i]) : 0;
+    if (c >= 0x80) key.ascii = false;
+    const uint64_t folded = c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c;
+    (i < 8 ? key.head : key.tail) |= folded << (8 * (7 - i % 8));
+  }
+  return key;
+}
+
+bool NameKeyBefore(const NameKey &a, const NameKey &b) {
+  if (a.ascii && b.ascii) {
+    if (a.head != b.head) return a.head < b.head;
+    if (a.tail != b.tail) return a.tail < b.tail;
+  }
+  return CompareNoCase(a.name, b.name) < 0;
+}
+
+std::vector<int> OrderByName(const DwgData *records, int count) {
+  std::vector<NameKey> keys;
+  keys.reserve(static_cast<size_t>(count));
+  for (int i = 0; i < count; ++i) keys.push_back(MakeNameKey(records[i].m_strDwgName, i));
+  std::sort(keys.begin(), keys.end(), NameKeyBefore);
+  std::vector<int> order;
+  order.reserve(keys.size());
+  for (const NameKey &key : keys) order.push_back(key.index);
+  return order;
+}
 }  // namespace
 
 bool CompareByName(const DwgData &a, const DwgData &b) {
@@ -44,19 +88,19 @@ void SortRecords(DwgCatalogue &catalogue, int sortKey) {
   const int count = catalogue.GetSize();
   if (count == 0) return;
 
-  bool (*compare)(const DwgData &, const DwgData &) = nullptr;
-  switch (sortKey) {
-  case kSortByName: compare = CompareByName; break;
-  case kSortByDate: compare = CompareByDate; break;
-  case kSortBySize: compare = CompareBySize; break;
-  default: return;
-  }
-  // A record is copied, name and all, each time the sort moves it; the sort orders indices
-  // instead and the records are then swapped into place.
   const DwgData *records = catalogue.GetData();
-  std::vector<int> order(static_cast<size_t>(count));
-  std::iota(order.begin(), order.end(), 0);
-  std::sort(order.begin(), order.end(), [&](int a, int b) { return compare(records[a], records[b]); });
+  std::vector<int> order;
+  if (sortKey == kSortByName) {
+    order = OrderByName(records, count);
+  } else if (sortKey == kSortByDate || sortKey == kSortBySize) {
+    // A record is copied, name and all, each time a sort moves it: indices are sorted instead.
+    order.resize(static_cast<size_t>(count));
+    std::iota(order.begin(), order.end(), 0);
+    const auto compare = sortKey == kSortByDate ? CompareByDate : CompareBySize;
+    std::sort(order.begin(), order.end(), [&](int a, int b) { return compare(records[a], records[b]); });
+  } else {
+    return;
+  }
   ApplyOrder(catalogue.GetData(), order);
 }
 

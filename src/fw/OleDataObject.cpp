@@ -39,14 +39,7 @@ CGlobalMemory COleDataObject::GetGlobalData(CLIPFORMAT format) const {
     medium.m_medium.tymed = TYMED_NULL;
     return block;
   }
-  CGlobalLock from(medium.m_medium.hGlobal);
-  if (!from.Data()) return nullptr;
-  CGlobalMemory copy(GlobalAlloc(GMEM_MOVEABLE, from.Size()));
-  if (!copy) return nullptr;
-  CGlobalLock to(copy.get());
-  if (!to.Data()) return nullptr;
-  std::memcpy(to.Data(), from.Data(), from.Size());
-  return copy;
+  return CopyGlobalMemory(medium.m_medium.hGlobal);
 }
 
 }  // namespace fw

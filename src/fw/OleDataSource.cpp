@@ -4,24 +4,12 @@
 #include <shlobj.h>
 #include <wrl/client.h>
 
-#include <cstring>
 #include <new>
 
 namespace fw {
 namespace {
 
 FORMATETC HGlobalFormat(CLIPFORMAT format) { return {format, nullptr, DVASPECT_CONTENT, -1, TYMED_HGLOBAL}; }
-
-CGlobalMemory CopyOf(HGLOBAL source) {
-  CGlobalLock from(source);
-  if (!from.Data()) return nullptr;
-  CGlobalMemory copy(GlobalAlloc(GMEM_MOVEABLE | GMEM_SHARE, from.Size()));
-  if (!copy) return nullptr;
-  CGlobalLock to(copy.get());
-  if (!to.Data()) return nullptr;
-  std::memcpy(to.Data(), from.Data(), from.Size());
-  return copy;
-}
 
 // What the clipboard holds while it owns the data source: answers for the cached formats and
 // hands out a fresh copy of a block on each request.
@@ -51,7 +39,7 @@ public:
     HGLOBAL block = nullptr;
     const HRESULT found = Find(*format, block);
     if (found != S_OK) return found;
-    CGlobalMemory copy = CopyOf(block);
+    CGlobalMemory copy = CopyGlobalMemory(block);
     if (!copy) return E_OUTOFMEMORY;
     medium->tymed = TYMED_HGLOBAL;
     medium->hGlobal = copy.release();

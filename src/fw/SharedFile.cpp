@@ -4,6 +4,17 @@
 
 namespace fw {
 
+CGlobalMemory CopyGlobalMemory(HGLOBAL source) {
+  CGlobalLock from(source);
+  if (!from.Data()) return nullptr;
+  CGlobalMemory copy(GlobalAlloc(GMEM_MOVEABLE | GMEM_SHARE, from.Size()));
+  if (!copy) return nullptr;
+  CGlobalLock to(copy.get());
+  if (!to.Data()) return nullptr;
+  std::memcpy(to.Data(), from.Data(), from.Size());
+  return copy;
+}
+
 CSharedFile::CSharedFile(UINT allocFlags, size_t growBytes)
     : m_nAllocFlags(allocFlags), m_nGrowBytes(growBytes ? growBytes : 1) {}
 

@@ -36,6 +36,9 @@ private:
   size_t m_nSize;
 };
 
+// A new movable, shared block with the same bytes; empty when it cannot be made.
+CGlobalMemory CopyGlobalMemory(HGLOBAL source);
+
 class CSharedFile {
 public:
   explicit CSharedFile(UINT allocFlags = GMEM_MOVEABLE | GMEM_ZEROINIT | GMEM_SHARE, size_t growBytes = 4096);

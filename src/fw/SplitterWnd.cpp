@@ -56,24 +56,24 @@ BOOL CSplitterWnd::CreateView(int row, int col, std::unique_ptr<CView> view, SIZ
 }
 
 CWnd *CSplitterWnd::GetPane(int row, int col) const {
-  const_cast<CSplitterWnd *>(this)->Row(row);
-  const_cast<CSplitterWnd *>(this)->Column(col);
+  Row(row);  // both throw for an index out of range
+  Column(col);
   if (CView *view = m_views[static_cast<size_t>(row * GetColumnCount() + col)].get()) return view;
   return FromHandlePermanent(::GetDlgItem(m_hWnd, IdFromRowCol(row, col)));
 }
 
-CSplitterWnd::RowColInfo &CSplitterWnd::Column(int col) {
+const CSplitterWnd::RowColInfo &CSplitterWnd::Column(int col) const {
   if (col < 0 || col >= GetColumnCount()) throw std::out_of_range("CSplitterWnd: column out of range");
   return m_cols[static_cast<size_t>(col)];
 }
 
-CSplitterWnd::RowColInfo &CSplitterWnd::Row(int row) {
+const CSplitterWnd::RowColInfo &CSplitterWnd::Row(int row) const {
   if (row < 0 || row >= GetRowCount()) throw std::out_of_range("CSplitterWnd: row out of range");
   return m_rows[static_cast<size_t>(row)];
 }
 
 void CSplitterWnd::GetColumnInfo(int col, int &cur, int &min) const {
-  const RowColInfo &info = const_cast<CSplitterWnd *>(this)->Column(col);
+  const RowColInfo &info = Column(col);
   cur = info.curSize;
   min = info.minSize;
 }
@@ -85,7 +85,7 @@ void CSplitterWnd::SetColumnInfo(int col, int ideal, int min) {
 }
 
 void CSplitterWnd::GetRowInfo(int row, int &cur, int &min) const {
-  const RowColInfo &info = const_cast<CSplitterWnd *>(this)->Row(row);
+  const RowColInfo &info = Row(row);
   cur = info.curSize;
   min = info.minSize;
 }

@@ -7,6 +7,7 @@
 #include "fw/View.h"
 
 #include <memory>
+#include <utility>
 #include <vector>
 
 namespace fw {
@@ -61,8 +62,10 @@ private:
   };
 
   static void LayoutRowCol(std::vector<RowColInfo> &infos, int size);
-  RowColInfo &Column(int col);
-  RowColInfo &Row(int row);
+  const RowColInfo &Column(int col) const;
+  const RowColInfo &Row(int row) const;
+  RowColInfo &Column(int col) { return const_cast<RowColInfo &>(std::as_const(*this).Column(col)); }
+  RowColInfo &Row(int row) { return const_cast<RowColInfo &>(std::as_const(*this).Row(row)); }
   Hit HitTest(POINT pt) const;
   RECT BarRect(const Hit &hit) const;
   void OnPaint();

@@ -11,7 +11,26 @@ failed=0
 work=$(mktemp -d)
 trap 'rm -rf "$work"' EXIT
 
-host() { "$run" "$bin/devhost.exe" "$@" >"$work/out" 2>"$work/err"; echo $? >"$work/rc"; }
+# Presses Escape in every explorer frame that opens until the process PID ends, as a person
+# cancelling each browse would.
+cancel_explorers() {
+  local pid=$1 frame
+  while kill -0 "$pid" 2>/dev/null; do
+    for frame in $(xdotool search --onlyvisible --name '^ombra3$' 2>/dev/null); do
+      xdotool windowactivate --sync "$frame" >/dev/null 2>&1 || xdotool windowfocus "$frame" >/dev/null 2>&1
+      xdotool key --clearmodifiers Escape >/dev/null 2>&1
+    done
+    sleep 0.3
+  done
+}
+
+host() {
+  "$run" "$bin/devhost.exe" "$@" >"$work/out" 2>"$work/err" &
+  local pid=$!
+  cancel_explorers "$pid"
+  wait "$pid"
+  echo $? >"$work/rc"
+}
 alerts() { grep '^alert: ' "$work/err" || true; }
 
 check() {  # check NAME EXPECTED ACTUAL
@@ -66,7 +85,9 @@ check "unknown option" 64 "$(cat "$work/rc")"
 host --batch --eval '(Lumvex 0 0 1 "" "")' --eval '(list "x" (Lumvex 0 0 "" "" ""))'
 direct_out=$(cat "$work/out")
 direct_alerts=$(alerts)
-"$root/lumvex" devhost --batch --eval '(Lumvex 0 0 1 "" "")' --eval '(list "x" (Lumvex 0 0 "" "" ""))' >"$work/out" 2>"$work/err"
+"$root/lumvex" devhost --batch --eval '(Lumvex 0 0 1 "" "")' --eval '(list "x" (Lumvex 0 0 "" "" ""))' >"$work/out" 2>"$work/err" &
+cancel_explorers $!
+wait $!
 check "./lumvex devhost: same stdout" "$direct_out" "$(cat "$work/out")"
 check "./lumvex devhost: same alerts" "$direct_alerts" "$(alerts)"
 "$root/lumvex" devhost --batch --module 'C:\nothing.arx' >/dev/null 2>&1

@@ -52,6 +52,24 @@ TEST(Ordering, NamesCompareWithoutRegardToCase) {
   EXPECT_FALSE(CompareByName(DwgData("plan.dwg", 0, 0), DwgData("PLAN.dwg", 0, 0)));
 }
 
+TEST(Ordering, ByNameIsTheOrderOfTheComparisonForAnyName) {
+  // Long shared beginnings, capitals, short names and bytes past ASCII before and after the
+  // 16th byte: the name sort must agree with CompareByName on every one.
+  std::vector<DwgData> records;
+  const char *stems[] = {"project-level-01-", "PROJECT-LEVEL-01-", "project-level-0", "p", "\xC4rger-", "plan\xE4-",
+                         "project-level-01-\xC4-", "z", "_", "project-level-01-a"};
+  int number = 0;
+  for (const char *stem : stems)
+    for (int i = 0; i < 12; ++i) records.emplace_back(stem + std::to_string(number++ * 37 % 1000) + ".dwg", 0, 0);
+
+  DwgCatalogue catalogue = Catalogue(records);
+  SortRecords(catalogue, kSortByName);
+  std::sort(records.begin(), records.end(), CompareByName);
+  std::vector<std::string> expected;
+  for (const DwgData &record : records) expected.push_back(record.m_strDwgName);
+  EXPECT_EQ(Names(catalogue), expected);
+}
+
 TEST(Ordering, OtherKeysLeaveTheListingOrder) {
   for (int key : {-1, 3, 5, 7}) {
     DwgCatalogue catalogue = Listing();

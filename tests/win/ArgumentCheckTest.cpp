@@ -1,6 +1,6 @@
 // (Lumvex short short string string string): every path of the argument check, with the
 // texts printed and alerted in their order, and every node released.
-#include "ModuleHarness.h"
+#include "ExplorerHarness.h"
 
 #include <gtest/gtest.h>
 
@@ -28,8 +28,20 @@ protected:
     return HostEvents();
   }
 
+  // A well-typed call opens the explorer: a watcher cancels it as soon as it shows.
+  std::vector<HostEvent> CallAndCancel(resbuf *args) {
+    devhostClearEvents();
+    std::vector<HostEvent> events;
+    const BrowseOutcome outcome = Browse(args, [](HWND frame) { PostMessageA(frame, WM_COMMAND, 32796, 0); });
+    EXPECT_TRUE(outcome.watcherFoundFrame);
+    m_resultKind = outcome.resultKind;
+    return HostEvents();
+  }
+
+  StateFileGuard m_state;
   LoadedModule m_module;
   long m_liveBefore = 0;
+  int m_resultKind = 0;
 };
 
 TEST_F(ArgumentCheck, NoArgumentsAtAll) {
@@ -60,25 +72,33 @@ TEST_F(ArgumentCheck, WrongTypeAtAnyLaterPositionReleasesFirstThenAlertsThenPrin
   EXPECT_EQ(devhostResultKind(), RTNONE);
 }
 
-TEST_F(ArgumentCheck, WellTypedCallReleasesItsArgumentsAndGivesNil) {
-  EXPECT_EQ(Call(acutBuildList(RTSHORT, 0, RTSHORT, -3, RTSTR, L"", RTSTR, L"", RTSTR, L"", 0)),
+TEST_F(ArgumentCheck, WellTypedCallReleasesItsArgumentsAndGivesNilWhenCancelled) {
+  EXPECT_EQ(CallAndCancel(acutBuildList(RTSHORT, 0, RTSHORT, -3, RTSTR, L"", RTSTR, L"", RTSTR, L"", 0)),
             (std::vector<HostEvent>{Released(5)}));
-  EXPECT_EQ(devhostResultKind(), RTNIL);
+  EXPECT_EQ(m_resultKind, RTNIL);
 }
 
 TEST_F(ArgumentCheck, ExtraArgumentsAreIgnored) {
-  EXPECT_EQ(Call(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", RTSHORT, 7, RTSTR, L"x", 0)),
-            (std::vector<HostEvent>{Released(7)}));
-  EXPECT_EQ(devhostResultKind(), RTNIL);
+  EXPECT_EQ(
+      CallAndCancel(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", RTSHORT, 7, RTSTR, L"x", 0)),
+      (std::vector<HostEvent>{Released(7)}));
+  EXPECT_EQ(m_resultKind, RTNIL);
 }
 
 TEST_F(ArgumentCheck, OverlongTextsAreCutNotOverrun) {
   const std::wstring longText(5000, L'x');
   const std::wstring longFolder = L"C:\\" + std::wstring(4000, L'd') + L"\\";
-  EXPECT_EQ(Call(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, longFolder.c_str(), RTSTR, longText.c_str(), RTSTR,
-                               longText.c_str(), 0)),
-            (std::vector<HostEvent>{Released(5)}));
-  EXPECT_EQ(devhostResultKind(), RTNIL);
+  std::vector<std::string> captions;
+  devhostClearEvents();
+  Browse(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, longFolder.c_str(), RTSTR, longText.c_str(), RTSTR, longText.c_str(), 0),
+         [&](HWND frame) {
+           const std::vector<HWND> bars = ToolBars(frame);
+           if (bars.size() == 2)
+             for (HWND caption : Children(bars[1], "STATIC")) captions.push_back(WindowText(caption));
+           PostMessageA(frame, WM_COMMAND, 32796, 0);
+         });
+  EXPECT_EQ(HostEvents(), (std::vector<HostEvent>{Released(5)}));
+  EXPECT_EQ(captions, (std::vector<std::string>(2, std::string(55, 'x')))) << "cut to the 56-byte caption buffers";
 }
 
 }  // namespace

@@ -174,8 +174,7 @@ TEST(FwViewTest, AClickedViewBecomesItsFramesActiveView) {
   auto *frame = new Frame;  // a frame deletes itself when its window is gone
   ASSERT_TRUE(frame->CreateEx(0, nullptr, "frame", WS_POPUP | WS_VISIBLE, RECT{40, 40, 640, 440},
                               static_cast<HWND>(nullptr), 0));
-  SetWindowPos(*frame, HWND_TOPMOST, 0, 0, 0, 0, SWP_NOMOVE | SWP_NOSIZE);
-  SetForegroundWindow(*frame);
+  fwtest::InputWindow() = *frame;
   Pump();
   fw::CWnd *left = frame->splitter.GetPane(0, 0);
   fw::CWnd *right = frame->splitter.GetPane(0, 1);

@@ -45,8 +45,22 @@ inline POINT CursorPosition() {
   return pt;
 }
 
+// The top-level window the test's input is meant for. Other programs' windows may show up on
+// the same display at any time, so it is raised above them before every input.
+inline HWND &InputWindow() {
+  static HWND window = nullptr;
+  return window;
+}
+
+inline void RaiseInputWindow() {
+  if (!IsWindow(InputWindow())) return;
+  SetWindowPos(InputWindow(), HWND_TOPMOST, 0, 0, 0, 0, SWP_NOMOVE | SWP_NOSIZE | SWP_NOACTIVATE);
+  if (GetForegroundWindow() != InputWindow()) SetForegroundWindow(InputWindow());
+}
+
 // Moves the pointer to a screen point through the input queue, as a mouse would.
 inline void MouseTo(POINT screen) {
+  RaiseInputWindow();
   INPUT input{};
   input.type = INPUT_MOUSE;
   input.mi.dx = (screen.x * 65536 + GetSystemMetrics(SM_CXSCREEN) / 2) / GetSystemMetrics(SM_CXSCREEN);
@@ -62,6 +76,7 @@ inline void MouseTo(POINT screen) {
 
 // Presses or releases the left button where the pointer is; done once this thread has seen it.
 inline void MouseButton(bool down) {
+  RaiseInputWindow();
   INPUT input{};
   input.type = INPUT_MOUSE;
   input.mi.dwFlags = down ? MOUSEEVENTF_LEFTDOWN : MOUSEEVENTF_LEFTUP;
@@ -76,16 +91,16 @@ inline POINT ScreenPoint(HWND window, int x, int y) {
   return pt;
 }
 
-// A visible top-level window of the framework's own class at a fixed place on the screen, the
-// foreground window and above other programs' windows, so that the pointer reaches it.
+// A visible top-level window of the framework's own class at a fixed place on the screen that
+// receives the test's input.
 class TopWindow : public fw::CWnd {
 public:
   BOOL Create(int width = 600, int height = 400) {
     const RECT place{40, 40, 40 + width, 40 + height};
     if (!CreateEx(0, nullptr, "fw test", WS_POPUP | WS_VISIBLE | WS_CLIPCHILDREN, place, static_cast<HWND>(nullptr), 0))
       return FALSE;
-    SetWindowPos(m_hWnd, HWND_TOPMOST, 0, 0, 0, 0, SWP_NOMOVE | SWP_NOSIZE);
-    SetForegroundWindow(m_hWnd);
+    InputWindow() = m_hWnd;
+    RaiseInputWindow();
     return TRUE;
   }
 };

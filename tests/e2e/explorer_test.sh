@@ -1,0 +1,75 @@
+#!/usr/bin/env bash
+# A browse through the development host driven with real X input: the explorer opens with the
+# remembered drawing's name in its search box, Escape ends it with nil, the state file keeps
+# every key with the name emptied, and a screenshot shows what the person saw.
+# Usage: explorer_test.sh BIN_DIR REPO_ROOT SCREENSHOT_DIR
+set -uo pipefail
+bin=$1
+root=$2
+shots=$3
+run="$root/cmake/wine-run"
+state="$bin/Lumvex1.ini"
+passed=0
+failed=0
+work=$(mktemp -d)
+saved=""
+[ -f "$state" ] && saved="$work/saved.ini" && cp "$state" "$saved"
+cleanup() {
+  if [ -n "$saved" ]; then cp "$saved" "$state"; else rm -f "$state"; fi
+  rm -rf "$work"
+}
+trap cleanup EXIT
+mkdir -p "$shots"
+
+check() {
+  if [ "$2" == "$3" ]; then
+    passed=$((passed + 1))
+  else
+    failed=$((failed + 1))
+    printf 'FAILED %s\n--- expected\n%s\n--- actual\n%s\n' "$1" "$2" "$3"
+  fi
+}
+
+printf '[CurrentPath]\r\nPath=\r\nName=plan.dwg\r\nShellPath=\r\n\r\n[Size]\r\nSplitterSize=180\r\nWindowWidth=900\r\nWindowHeight=600\r\n\r\n[View]\r\nPictureWidth=0\r\nPictureHeight=0\r\nSort=1\r\n\r\n' >"$state"
+
+"$run" "$bin/devhost.exe" --batch --eval '(Lumvex 0 0 "" "Insert" "Close")' >"$work/out" 2>"$work/err" &
+host=$!
+frame=""
+for _ in $(seq 100); do
+  frame=$(xdotool search --onlyvisible --name '^ombra3$' 2>/dev/null | head -n 1)
+  [ -n "$frame" ] && break
+  sleep 0.2
+done
+check "the explorer frame opens" "yes" "$([ -n "$frame" ] && echo yes || echo no)"
+sleep 1
+import -window root "$shots/explorer.png"
+check "screenshot saved" "yes" "$([ -s "$shots/explorer.png" ] && echo yes || echo no)"
+
+xdotool windowactivate --sync "$frame" >/dev/null 2>&1 || xdotool windowfocus "$frame" >/dev/null 2>&1
+xdotool key --clearmodifiers Escape
+for _ in $(seq 50); do
+  kill -0 "$host" 2>/dev/null || break
+  sleep 0.2
+done
+kill -0 "$host" 2>/dev/null && { kill "$host"; echo "FAILED: the host did not end after Escape"; failed=$((failed + 1)); }
+wait "$host"
+
+check "Escape gives nil" "nil" "$(cat "$work/out")"
+ini=$(tr -d '\r' <"$state")
+check "state file: every key, the name emptied" "[CurrentPath]
+Path=
+Name=
+ShellPath=
+
+[Size]
+SplitterSize=180
+WindowWidth=900
+WindowHeight=600
+
+[View]
+PictureWidth=173
+PictureHeight=143
+Sort=1" "$ini"
+
+echo "e2e explorer: $passed passed, $failed failed"
+[ "$failed" -eq 0 ]

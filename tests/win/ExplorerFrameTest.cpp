@@ -1,0 +1,239 @@
+// The explorer frame of a browse call, on real windows: layout, commands, check marks, how the
+// browse ends and what it leaves in the state file.
+#include "ExplorerHarness.h"
+
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+
+namespace {
+constexpr int kAccept = 32795;
+constexpr int kCancel = 32796;
+constexpr int kSortByName = 32799;
+constexpr int kSortByDate = 32788;
+constexpr int kSortBySize = 32789;
+
+std::string StateFile(int sort, int width, int height, const std::string &path = "", const std::string &name = "") {
+  std::ostringstream ini;
+  ini << "[CurrentPath]\r\nPath=" << path << "\r\nName=" << name << "\r\nShellPath=\r\n\r\n"
+      << "[Size]\r\nSplitterSize=150\r\nWindowWidth=" << width << "\r\nWindowHeight=" << height << "\r\n\r\n"
+      << "[View]\r\nPictureWidth=0\r\nPictureHeight=0\r\nSort=" << sort << "\r\n\r\n";
+  return ini.str();
+}
+
+std::string IniValue(const std::string &ini, const std::string &key) {
+  const std::string marker = "\r\n" + key + "=";
+  const size_t at = ini.find(marker);
+  if (at == std::string::npos) return "<missing>";
+  const size_t start = at + marker.size();
+  return ini.substr(start, ini.find("\r\n", start) - start);
+}
+
+void Command(HWND frame, int id) { PostMessageA(frame, WM_COMMAND, id, 0); }
+
+class ExplorerFrame : public ::testing::Test {
+protected:
+  void SetUp() override { ASSERT_EQ(m_module.LoadResult(), kDevhostLoaded); }
+  StateFileGuard m_state;
+  LoadedModule m_module;
+};
+
+TEST_F(ExplorerFrame, LayoutOfToolBarsLabelsCaptionsAndStatusBar) {
+  m_state.Remove();
+  std::vector<int> topIds, bottomIds;
+  std::vector<std::string> topTexts, bottomTexts;
+  std::vector<RECT> captionRects, buttonRects;
+  int statusParts = 0;
+  std::string statusText, title;
+  bool acceptEnabled = true;
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    title = WindowText(frame);
+    const std::vector<HWND> bars = ToolBars(frame);
+    if (bars.size() != 2) return Command(frame, kCancel);
+    topIds = ToolBarIds(bars[0]);
+    bottomIds = ToolBarIds(bars[1]);
+    for (HWND label : Children(bars[0], "STATIC")) topTexts.push_back(WindowText(label));
+    for (HWND caption : Children(bars[1], "STATIC")) {
+      bottomTexts.push_back(WindowText(caption));
+      RECT rect;
+      GetWindowRect(caption, &rect);
+      captionRects.push_back(rect);
+    }
+    for (int index : {0, 2}) {
+      RECT rect;
+      SendMessageA(bars[1], TB_GETITEMRECT, index, reinterpret_cast<LPARAM>(&rect));
+      MapWindowPoints(bars[1], nullptr, reinterpret_cast<POINT *>(&rect), 2);
+      buttonRects.push_back(rect);
+    }
+    acceptEnabled = SendMessageA(bars[1], TB_ISBUTTONENABLED, kAccept, 0) != 0;
+    HWND status = FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr);
+    statusParts = static_cast<int>(SendMessageA(status, SB_GETPARTS, 0, 0));
+    char text[128] = "";
+    SendMessageA(status, SB_GETTEXTA, 0, reinterpret_cast<LPARAM>(text));
+    statusText = text;
+    Command(frame, kCancel);
+  });
+  ASSERT_TRUE(outcome.watcherFoundFrame);
+  EXPECT_EQ(title, "ombra3");
+  EXPECT_EQ(topIds, (std::vector<int>{32771, 0, 32774, 0, 32775, 0, 32782, 0, 32804, 32790, 32805}));
+  EXPECT_EQ(bottomIds, (std::vector<int>{kAccept, 0, kCancel}));
+  EXPECT_EQ(topTexts, (std::vector<std::string>{"Search:", " Layer name:"}));
+  EXPECT_EQ(bottomTexts, (std::vector<std::string>{"Insert", "Close"}));
+  ASSERT_EQ(captionRects.size(), 2u);
+  for (size_t i = 0; i < 2; ++i) {
+    const int captionCentreX = (captionRects[i].left + captionRects[i].right) / 2;
+    const int buttonCentreX = (buttonRects[i].left + buttonRects[i].right) / 2;
+    EXPECT_NEAR(captionCentreX, buttonCentreX, 1) << "caption " << i << " is centred over its button";
+    EXPECT_LT(captionRects[i].right - captionRects[i].left, buttonRects[i].right - buttonRects[i].left);
+  }
+  EXPECT_FALSE(acceptEnabled) << "nothing is chosen yet";
+  EXPECT_EQ(statusParts, 4);
+  EXPECT_EQ(statusText, "Ready");
+  EXPECT_EQ(outcome.resultKind, RTNIL);
+}
+
+TEST_F(ExplorerFrame, DefaultCaptionsAreOkAndCancel) {
+  std::vector<std::string> captions;
+  Browse(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", 0), [&](HWND frame) {
+    const std::vector<HWND> bars = ToolBars(frame);
+    if (bars.size() == 2)
+      for (HWND caption : Children(bars[1], "STATIC")) captions.push_back(WindowText(caption));
+    Command(frame, kCancel);
+  });
+  EXPECT_EQ(captions, (std::vector<std::string>{"Ok", "Cancel"}));
+}
+
+TEST_F(ExplorerFrame, SortMenuChecksTheRememberedKeyOnly) {
+  for (int remembered : {0, 1, 2, 7}) {
+    m_state.Write(StateFile(remembered, 0, 0));
+    std::vector<bool> checked;
+    Browse(BrowseArgs(L""), [&](HWND frame) {
+      HMENU sort = GetSubMenu(GetMenu(frame), 2);
+      SendMessageA(frame, WM_INITMENUPOPUP, reinterpret_cast<WPARAM>(sort), 2);
+      for (int id : {kSortByName, kSortByDate, kSortBySize}) checked.push_back(GetMenuState(sort, id, MF_BYCOMMAND) & MF_CHECKED);
+      Command(frame, kCancel);
+    });
+    std::vector<bool> expected{remembered == 0, remembered == 1, remembered == 2};
+    EXPECT_EQ(checked, expected) << "remembered key " << remembered;
+    EXPECT_EQ(IniValue(m_state.Read(), "Sort"), std::to_string(remembered)) << "the key is kept as it was";
+  }
+}
+
+TEST_F(ExplorerFrame, SortCommandsSetTheKeyAndMoveTheCheckMark) {
+  m_state.Write(StateFile(7, 0, 0));
+  std::vector<bool> checked;
+  Browse(BrowseArgs(L""), [&](HWND frame) {
+    SendMessageA(frame, WM_COMMAND, kSortBySize, 0);
+    HMENU sort = GetSubMenu(GetMenu(frame), 2);
+    SendMessageA(frame, WM_INITMENUPOPUP, reinterpret_cast<WPARAM>(sort), 2);
+    for (int id : {kSortByName, kSortByDate, kSortBySize}) checked.push_back(GetMenuState(sort, id, MF_BYCOMMAND) & MF_CHECKED);
+    Command(frame, kCancel);
+  });
+  EXPECT_EQ(checked, (std::vector<bool>{false, false, true}));
+  EXPECT_EQ(IniValue(m_state.Read(), "Sort"), "2");
+}
+
+TEST_F(ExplorerFrame, AcceptThenCloseEndsWithAccept) {
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    Command(frame, kAccept);
+    PostMessageA(frame, WM_CLOSE, 0, 0);
+  });
+  EXPECT_EQ(outcome.resultKind, RTLB) << "the first end message decides";
+  EXPECT_EQ(outcome.texts.size(), 4u);
+}
+
+TEST_F(ExplorerFrame, CloseBoxCancelsAfterStoringTheGeometry) {
+  m_state.Write(StateFile(0, 900, 600));
+  RECT frameRect{};
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    GetWindowRect(frame, &frameRect);
+    PostMessageA(frame, WM_SYSCOMMAND, SC_CLOSE, 0);
+  });
+  EXPECT_EQ(outcome.resultKind, RTNIL);
+  const std::string ini = m_state.Read();
+  EXPECT_EQ(IniValue(ini, "WindowWidth"), std::to_string(frameRect.right - frameRect.left));
+  EXPECT_EQ(IniValue(ini, "WindowHeight"), std::to_string(frameRect.bottom - frameRect.top));
+  EXPECT_EQ(IniValue(ini, "SplitterSize"), "150");
+}
+
+TEST_F(ExplorerFrame, PlacementDefaultMovedOrMaximised) {
+  struct Case {
+    int width, height;
+    bool maximised, sized;
+  };
+  for (const Case &c : {Case{0, 0, false, false}, Case{700, 500, false, true}, Case{9000, 9000, true, false}}) {
+    m_state.Write(StateFile(0, c.width, c.height));
+    bool zoomed = false;
+    RECT rect{};
+    Browse(BrowseArgs(L""), [&](HWND frame) {
+      zoomed = IsZoomed(frame);
+      GetWindowRect(frame, &rect);
+      Command(frame, kCancel);
+    });
+    EXPECT_EQ(zoomed, c.maximised) << c.width << "x" << c.height;
+    if (c.sized) {
+      EXPECT_EQ(rect.right - rect.left, c.width);
+      EXPECT_EQ(rect.bottom - rect.top, c.height);
+    }
+  }
+}
+
+TEST_F(ExplorerFrame, AcceptReturnsThePathWithTheFolderSettings) {
+  char temp[MAX_PATH];
+  GetTempPathA(MAX_PATH, temp);
+  const std::string folder = std::string(temp) + "lumvex-accept";
+  CreateDirectoryA(folder.c_str(), nullptr);
+  std::ofstream(folder + "\\datains.ini", std::ios::binary)
+      << "[Default Parameters]\r\nLayer=WALLS\r\nLisp command=MYCMD\r\nColor=1\r\n\r\n";
+  m_state.Write(StateFile(0, 0, 0, folder, "plan.dwg"));
+  std::string searchText;
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    const std::vector<HWND> bars = ToolBars(frame);
+    if (!bars.empty())
+      for (HWND edit : Children(bars[0], "EDIT")) searchText = WindowText(edit);
+    Command(frame, kAccept);
+  });
+  ASSERT_EQ(outcome.resultKind, RTLB);
+  ASSERT_EQ(outcome.texts.size(), 4u);
+  EXPECT_EQ(StateFileGuard::Narrow(outcome.texts[0]), folder + "\\") << "the folder gets its separator";
+  EXPECT_EQ(outcome.texts[1], L"WALLS");
+  EXPECT_EQ(outcome.texts[2], L"1");
+  EXPECT_EQ(outcome.texts[3], L"MYCMD");
+  EXPECT_EQ(searchText, "plan") << "the remembered name's base name goes into the search box";
+  const std::string ini = m_state.Read();
+  EXPECT_EQ(IniValue(ini, "Name"), "") << "the remembered name is emptied";
+  EXPECT_EQ(IniValue(ini, "Path"), folder + "\\");
+  DeleteFileA((folder + "\\datains.ini").c_str());
+  RemoveDirectoryA(folder.c_str());
+}
+
+TEST_F(ExplorerFrame, AcceptWithoutFolderSettingsGivesThreeEmptyTexts) {
+  m_state.Write(StateFile(0, 0, 0, "C:\\"));
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) { Command(frame, kAccept); });
+  ASSERT_EQ(outcome.resultKind, RTLB);
+  EXPECT_EQ(outcome.texts, (std::vector<std::wstring>{L"C:\\", L"", L"", L""})) << "C:\\ keeps its one separator";
+}
+
+TEST_F(ExplorerFrame, HostWindowIsDisabledWhileTheExplorerIsOpen) {
+  HWND host = CreateWindowExA(0, "STATIC", "host", WS_OVERLAPPEDWINDOW, 0, 0, 100, 100, nullptr, nullptr, nullptr, nullptr);
+  devhostSetWindows(host, nullptr);
+  bool enabledDuring = true;
+  Browse(BrowseArgs(L""), [&](HWND frame) {
+    enabledDuring = IsWindowEnabled(host);
+    Command(frame, kCancel);
+  });
+  EXPECT_FALSE(enabledDuring);
+  EXPECT_TRUE(IsWindowEnabled(host));
+  devhostSetWindows(nullptr, nullptr);
+  DestroyWindow(host);
+}
+
+TEST_F(ExplorerFrame, EscapeInAPaneCancels) {
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    HWND splitter = GetDlgItem(frame, 0xE900);
+    HWND left = GetDlgItem(splitter, 0xE900);
+    PostMessageA(left, WM_KEYDOWN, VK_ESCAPE, 0);
+  });
+  EXPECT_EQ(outcome.resultKind, RTNIL);
+}
+}  // namespace

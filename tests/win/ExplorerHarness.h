@@ -1,0 +1,128 @@
+// Runs browse calls of the loaded module while a watcher thread finds the explorer frame,
+// looks at it and acts on it as a person would, then reads the LISP result.
+#pragma once
+
+#include "ModuleHarness.h"
+
+#include <windows.h>
+#include <commctrl.h>
+
+#include <fstream>
+#include <functional>
+#include <sstream>
+#include <string>
+#include <thread>
+#include <vector>
+
+// Keeps the module's state file as it was before the test and restores it after.
+class StateFileGuard {
+public:
+  StateFileGuard() : m_path(Narrow(ProgramFolder()) + "Lumvex1.ini") {
+    std::ifstream in(m_path, std::ios::binary);
+    m_existed = in.good();
+    if (m_existed) m_content.assign(std::istreambuf_iterator<char>(in), {});
+  }
+  ~StateFileGuard() {
+    if (m_existed) std::ofstream(m_path, std::ios::binary) << m_content;
+    else DeleteFileA(m_path.c_str());
+  }
+  StateFileGuard(const StateFileGuard &) = delete;
+  StateFileGuard &operator=(const StateFileGuard &) = delete;
+
+  const std::string &Path() const { return m_path; }
+  void Write(const std::string &content) const { std::ofstream(m_path, std::ios::binary) << content; }
+  void Remove() const { DeleteFileA(m_path.c_str()); }
+  std::string Read() const {
+    std::ifstream in(m_path, std::ios::binary);
+    return std::string(std::istreambuf_iterator<char>(in), {});
+  }
+
+  static std::string Narrow(const std::wstring &text) { return std::string(text.begin(), text.end()); }
+
+private:
+  std::string m_path;
+  bool m_existed = false;
+  std::string m_content;
+};
+
+inline HWND WaitForWindow(const char *className, const char *title, int milliseconds = 15000) {
+  for (int waited = 0; waited < milliseconds; waited += 50) {
+    if (HWND hwnd = FindWindowA(className, title); hwnd && IsWindowVisible(hwnd)) return hwnd;
+    Sleep(50);
+  }
+  return nullptr;
+}
+
+// The frame once the explorer has started: its thread answers only when back in its message
+// loop, that is after the frame was placed, shown and given its first texts.
+inline HWND WaitForFrame() {
+  HWND frame = WaitForWindow("FwFrame128", nullptr);
+  if (frame) SendMessageA(frame, WM_NULL, 0, 0);
+  return frame;
+}
+
+inline std::string WindowText(HWND hwnd) {
+  char text[512] = "";
+  GetWindowTextA(hwnd, text, sizeof text);
+  return text;
+}
+
+inline std::vector<HWND> Children(HWND parent, const char *className) {
+  std::vector<HWND> found;
+  for (HWND child = FindWindowExA(parent, nullptr, className, nullptr); child;
+       child = FindWindowExA(parent, child, className, nullptr))
+    found.push_back(child);
+  return found;
+}
+
+// The frame's tool bars: the top one first.
+inline std::vector<HWND> ToolBars(HWND frame) {
+  std::vector<HWND> bars = Children(frame, TOOLBARCLASSNAMEA);
+  std::sort(bars.begin(), bars.end(), [](HWND a, HWND b) {
+    RECT ra, rb;
+    GetWindowRect(a, &ra);
+    GetWindowRect(b, &rb);
+    return ra.top < rb.top;
+  });
+  return bars;
+}
+
+inline std::vector<int> ToolBarIds(HWND bar) {
+  std::vector<int> ids;
+  const int count = static_cast<int>(SendMessageA(bar, TB_BUTTONCOUNT, 0, 0));
+  for (int i = 0; i < count; ++i) {
+    TBBUTTON button{};
+    SendMessageA(bar, TB_GETBUTTON, i, reinterpret_cast<LPARAM>(&button));
+    ids.push_back((button.fsStyle & TBSTYLE_SEP) && button.idCommand <= 0 ? 0 : button.idCommand);
+  }
+  return ids;
+}
+
+// One browse call: the watcher runs on its own thread while the call's modal loop runs here.
+struct BrowseOutcome {
+  int resultKind = 0;
+  std::vector<std::wstring> texts;  // every string of the result, in order
+  bool watcherFoundFrame = false;
+};
+
+inline BrowseOutcome Browse(resbuf *args, const std::function<void(HWND frame)> &watcher) {
+  BrowseOutcome outcome;
+  std::thread watch([&] {
+    HWND frame = WaitForFrame();
+    outcome.watcherFoundFrame = frame != nullptr;
+    if (frame) watcher(frame);
+  });
+  devhostInvoke(L"Lumvex", args);
+  watch.join();
+  outcome.resultKind = devhostResultKind();
+  resbuf *result = devhostResultCopy();
+  for (resbuf *node = result; node; node = node->rbnext)
+    if (node->restype == RTSTR) outcome.texts.emplace_back(node->resval.rstring);
+  acutRelRb(result);
+  devhostClearResult();
+  return outcome;
+}
+
+inline resbuf *BrowseArgs(const wchar_t *folder, const wchar_t *accept = L"Insert", const wchar_t *cancel = L"Close") {
+  return acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, folder, RTSTR, accept, RTSTR, cancel, 0);
+}
