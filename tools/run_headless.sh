@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Runs the development host on a display nobody looks at (Xvfb): evaluates the browse call,
-# saves a screenshot of what a person would see, closes the host with real X input and prints
-# the command line (the LISP result included).
+# saves a screenshot of the open explorer, cancels it and closes the host with real X input,
+# and prints the command line (the LISP result included).
 # Usage: run_headless.sh DEVHOST_EXE LISP_CALL SCREENSHOT_DIR
 set -euo pipefail
 exe=$1
@@ -14,25 +14,37 @@ trap 'rm -f "$out"' EXIT
 wine "$exe" --eval "$call" >"$out" 2>&1 &
 host=$!
 
-window=""
-for _ in $(seq 100); do
-  window=$(xdotool search --name '^Lumvex development host$' 2>/dev/null | head -n 1 || true)
-  [ -n "$window" ] && break
-  sleep 0.2
-done
-if [ -z "$window" ]; then
-  echo "lumvex: the development host did not open a window" >&2
+wait_for_window() {
+  local name=$1 window=""
+  for _ in $(seq 100); do
+    window=$(xdotool search --onlyvisible --name "$name" 2>/dev/null | head -n 1 || true)
+    [ -n "$window" ] && break
+    sleep 0.2
+  done
+  echo "$window"
+}
+
+press() {  # press WINDOW KEY
+  xdotool windowactivate --sync "$1" >/dev/null 2>&1 || xdotool windowfocus "$1" >/dev/null 2>&1 || true
+  xdotool key --clearmodifiers "$2"
+}
+
+explorer=$(wait_for_window '^ombra3$')
+if [ -z "$explorer" ]; then
+  echo "lumvex: the explorer did not open" >&2
   kill "$host" 2>/dev/null || true
   cat "$out"
   exit 1
 fi
 sleep 1
-shot="$shots/devhost-$(date +%Y%m%d-%H%M%S).png"
+shot="$shots/explorer-$(date +%Y%m%d-%H%M%S).png"
 import -window root "$shot"
 echo "screenshot: $shot"
+press "$explorer" Escape
 
-xdotool windowactivate --sync "$window" 2>/dev/null || xdotool windowfocus "$window"
-xdotool key --clearmodifiers alt+F4
+hostWindow=$(wait_for_window '^Lumvex development host$')
+sleep 0.5
+[ -n "$hostWindow" ] && press "$hostWindow" alt+F4
 for _ in $(seq 50); do
   kill -0 "$host" 2>/dev/null || break
   sleep 0.2

@@ -2,4 +2,4 @@
 
 #include "res/resource.h"
 
-CAboutDlgArx::CAboutDlgArx() : CDialog(IDD_ABOUTBOX) {}
+CAboutDlgArx::CAboutDlgArx(fw::CWnd *parent) : CDialog(IDD_ABOUTBOX, parent) {}

@@ -5,5 +5,5 @@
 
 class CAboutDlgArx : public fw::CDialog {
 public:
-  CAboutDlgArx();
+  explicit CAboutDlgArx(fw::CWnd *parent = nullptr);
 };

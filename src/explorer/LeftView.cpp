@@ -16,7 +16,7 @@ CLeftView::~CLeftView() {
 void CLeftView::RefreshSelectedFolder() {
   if (!g_pDoc || g_pDoc->m_strPath.empty()) return;
   ScanFolder(g_pDoc->m_strPath, ".dwg");
-  if (g_pThumbView) g_pThumbView->ResetAndBuild(TRUE);
+  if (g_pThumbView) g_pThumbView->ReloadFolder();
 }
 
 LRESULT CLeftView::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {

@@ -239,7 +239,7 @@ BOOL CMainFrame::OnFrameCommand(UINT id, int code, fw::CCmdUI *cmdUI) {
   case ID_BROWSE_ACCEPT: EndBrowse(1); return TRUE;
   case ID_BROWSE_CANCEL: EndBrowse(2); return TRUE;
   case ID_APP_ABOUT: {
-    CAboutDlgArx about;
+    CAboutDlgArx about(this);
     about.DoModal();
     return TRUE;
   }

@@ -52,8 +52,7 @@ HTREEITEM CTreeCtrl::InsertItem(const std::string &text, HTREEITEM parent, HTREE
   return InsertItem(insert);
 }
 
-HTREEITEM CTreeCtrl::InsertItem(const std::string &text, int image, int selectedImage, HTREEITEM parent,
-                                HTREEITEM after) const {
+HTREEITEM CTreeCtrl::InsertItem(const std::string &text, int image, int selectedImage, HTREEITEM parent, HTREEITEM after) const {
   TVINSERTSTRUCTA insert{};
   insert.hParent = parent;
   insert.hInsertAfter = after;

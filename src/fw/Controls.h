@@ -14,7 +14,7 @@
 namespace fw {
 
 class CEdit : public CWnd {
-public:
+ public:
   BOOL Create(DWORD style, const RECT &rect, CWnd *parent, UINT id);
 
   void SetSel(int start, int end, BOOL noScroll = FALSE) const;
@@ -28,12 +28,12 @@ public:
 };
 
 class CStatic : public CWnd {
-public:
+ public:
   BOOL Create(const std::string &text, DWORD style, const RECT &rect, CWnd *parent, UINT id = 0xFFFF);
 };
 
 class CTreeCtrl : public CWnd {
-public:
+ public:
   BOOL Create(DWORD style, const RECT &rect, CWnd *parent, UINT id);
 
   HTREEITEM InsertItem(const TVINSERTSTRUCTA &insert) const;
@@ -67,30 +67,20 @@ public:
   HTREEITEM GetSelectedItem() const { return GetNextItem(nullptr, TVGN_CARET); }
   HTREEITEM GetDropHilightItem() const { return GetNextItem(nullptr, TVGN_DROPHILITE); }
 
-  BOOL Expand(HTREEITEM item, UINT code) const {
-    return static_cast<BOOL>(SendMessage(TVM_EXPAND, code, Param(item)));
-  }
+  BOOL Expand(HTREEITEM item, UINT code) const { return static_cast<BOOL>(SendMessage(TVM_EXPAND, code, Param(item))); }
   // Selects item as the caret, the drop target or the first visible item (TVGN_*).
-  BOOL Select(HTREEITEM item, UINT code) const {
-    return static_cast<BOOL>(SendMessage(TVM_SELECTITEM, code, Param(item)));
-  }
+  BOOL Select(HTREEITEM item, UINT code) const { return static_cast<BOOL>(SendMessage(TVM_SELECTITEM, code, Param(item))); }
   BOOL SelectItem(HTREEITEM item) const { return Select(item, TVGN_CARET); }
-  BOOL SortChildrenCB(const TVSORTCB &sort) const {
-    return static_cast<BOOL>(SendMessage(TVM_SORTCHILDRENCB, 0, Param(&sort)));
-  }
-  HTREEITEM HitTest(TVHITTESTINFO *info) const {
-    return reinterpret_cast<HTREEITEM>(SendMessage(TVM_HITTEST, 0, Param(info)));
-  }
+  BOOL SortChildrenCB(const TVSORTCB &sort) const { return static_cast<BOOL>(SendMessage(TVM_SORTCHILDRENCB, 0, Param(&sort))); }
+  HTREEITEM HitTest(TVHITTESTINFO *info) const { return reinterpret_cast<HTREEITEM>(SendMessage(TVM_HITTEST, 0, Param(info))); }
   // The tree does not own the list: its creator destroys it after the tree.
   HIMAGELIST SetImageList(HIMAGELIST list, int type) const {
     return reinterpret_cast<HIMAGELIST>(SendMessage(TVM_SETIMAGELIST, type, Param(list)));
   }
-  HIMAGELIST GetImageList(int type) const {
-    return reinterpret_cast<HIMAGELIST>(SendMessage(TVM_GETIMAGELIST, type));
-  }
+  HIMAGELIST GetImageList(int type) const { return reinterpret_cast<HIMAGELIST>(SendMessage(TVM_GETIMAGELIST, type)); }
   COLORREF GetBkColor() const { return static_cast<COLORREF>(SendMessage(TVM_GETBKCOLOR)); }
 
-private:
+ private:
   template <class T>
   static LPARAM Param(T *pointer) {
     return reinterpret_cast<LPARAM>(pointer);

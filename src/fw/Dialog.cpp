@@ -117,7 +117,12 @@ INT_PTR CDialog::DoModal() {
   auto templateData = static_cast<LPCDLGTEMPLATEA>(loaded ? LockResource(loaded) : nullptr);
   if (!templateData) return -1;
 
-  HWND owner = m_pParentWnd ? m_pParentWnd->m_hWnd : ::GetActiveWindow();
+  // Without a parent the owner is the main window's last active pop-up (the explorer frame for
+  // a dialog of the explorer), or else the active window, as the class library chooses it.
+  HWND owner = m_pParentWnd ? m_pParentWnd->m_hWnd : nullptr;
+  CWinApp *app = AfxGetApp();
+  if (!owner && app && app->m_pMainWnd && app->m_pMainWnd->m_hWnd) owner = ::GetLastActivePopup(app->m_pMainWnd->m_hWnd);
+  if (!owner) owner = ::GetActiveWindow();
   if (owner) owner = ::GetAncestor(owner, GA_ROOT);
   const bool disabledOwner = owner && ::IsWindowEnabled(owner);
   if (disabledOwner) ::EnableWindow(owner, FALSE);

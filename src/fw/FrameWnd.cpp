@@ -1,9 +1,8 @@
 #include "fw/FrameWnd.h"
 
 #include "fw/CmdUI.h"
+#include "fw/View.h"
 #include "fw/WinApp.h"
-
-#include <commctrl.h>
 
 #include <algorithm>
 
@@ -67,6 +66,7 @@ BOOL CFrameWnd::LoadFrame(UINT resourceId, DWORD style, CWnd *owner) {
     return FALSE;
   }
   SetMessageText(AFX_IDS_IDLEMESSAGE);
+  SendInitialUpdate();
   return TRUE;
 }
 
@@ -78,7 +78,22 @@ void CFrameWnd::OnDestroy() {}
 
 void CFrameWnd::PostNcDestroy() { delete this; }
 
-void CFrameWnd::SetActiveView(CWnd *view) { m_pActiveView = view; }
+void CFrameWnd::SetActiveView(CWnd *view) {
+  if (view == m_pActiveView) return;
+  auto *previous = dynamic_cast<CView *>(m_pActiveView);
+  auto *next = dynamic_cast<CView *>(view);
+  m_pActiveView = view;
+  if (previous) previous->OnActivateView(FALSE, next, previous);
+  if (next) next->OnActivateView(TRUE, next, previous);
+}
+
+void CFrameWnd::SendInitialUpdate() {
+  HWND pane = ::GetDlgItem(m_hWnd, AFX_IDW_PANE_FIRST);
+  if (!pane) return;
+  ::SendMessageA(pane, WM_INITIALUPDATE, 0, 0);
+  for (HWND child = ::GetWindow(pane, GW_CHILD); child; child = ::GetWindow(child, GW_HWNDNEXT))
+    ::SendMessageA(child, WM_INITIALUPDATE, 0, 0);
+}
 
 void CFrameWnd::DockControlBar(CControlBar *bar) {
   if (!bar || std::find(m_dockedBars.begin(), m_dockedBars.end(), bar) != m_dockedBars.end()) return;
@@ -242,20 +257,6 @@ LRESULT CFrameWnd::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
     else SetMessageText(std::string(lParam ? reinterpret_cast<const char *>(lParam) : ""));
     return 0;
   case WM_IDLEUPDATECMDUI: OnIdleUpdate(); return 0;
-  case WM_NOTIFY: {
-    auto *header = reinterpret_cast<NMHDR *>(lParam);
-    if (header->code == TTN_GETDISPINFOA) {
-      // Tool tips: the part of the command's string after "\n".
-      auto *info = reinterpret_cast<NMTTDISPINFOA *>(lParam);
-      const std::string text = AfxLoadString(static_cast<UINT>(header->idFrom));
-      const size_t newline = text.find('\n');
-      const std::string tip = newline == std::string::npos ? std::string() : text.substr(newline + 1);
-      lstrcpynA(info->szText, tip.c_str(), sizeof info->szText);
-      info->lpszText = info->szText;
-      return 0;
-    }
-    break;
-  }
   default: break;
   }
   return CWnd::WindowProc(message, wParam, lParam);

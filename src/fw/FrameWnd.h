@@ -66,6 +66,8 @@ protected:
   UINT m_nIDResource = 0;
 
 private:
+  // The views learn that their frame is complete, as a document template would tell them.
+  void SendInitialUpdate();
   void OnInitMenuPopup(HMENU popup);
   void OnMenuSelect(UINT id, UINT flags, HMENU menu);
   void ActivateNextPane(bool previous);

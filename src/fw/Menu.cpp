@@ -39,8 +39,7 @@ HMENU CMenu::Detach() {
 
 UINT CMenu::TrackPopup(HMENU menu, UINT flags, int x, int y, HWND owner) {
   if (!menu) return 0;
-  const BOOL chosen =
-      ::TrackPopupMenu(menu, flags | TPM_RETURNCMD | TPM_NONOTIFY | TPM_RIGHTBUTTON, x, y, 0, owner, nullptr);
+  const BOOL chosen = ::TrackPopupMenu(menu, flags | TPM_RETURNCMD | TPM_NONOTIFY | TPM_RIGHTBUTTON, x, y, 0, owner, nullptr);
   return chosen > 0 ? static_cast<UINT>(chosen) : 0;
 }
 

@@ -7,7 +7,7 @@
 namespace fw {
 
 class CMenu {
-public:
+ public:
   CMenu() = default;
   ~CMenu() { DestroyMenu(); }
   CMenu(const CMenu &) = delete;
@@ -23,9 +23,7 @@ public:
   HMENU GetSafeHmenu() const { return m_hMenu; }
   operator HMENU() const { return m_hMenu; }
 
-  BOOL AppendMenu(UINT flags, UINT_PTR id = 0, LPCSTR text = nullptr) const {
-    return ::AppendMenuA(m_hMenu, flags, id, text);
-  }
+  BOOL AppendMenu(UINT flags, UINT_PTR id = 0, LPCSTR text = nullptr) const { return ::AppendMenuA(m_hMenu, flags, id, text); }
   // The pop-up at `position`; it stays owned by this menu.
   HMENU GetSubMenu(int position) const { return ::GetSubMenu(m_hMenu, position); }
   int GetMenuItemCount() const { return ::GetMenuItemCount(m_hMenu); }

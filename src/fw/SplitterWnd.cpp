@@ -10,7 +10,7 @@ bool Contains(const RECT &rect, POINT pt) { return ::PtInRect(&rect, pt) != FALS
 
 // The grey of a dragged bar: every other pixel inverted, as window systems draw resize tracks.
 class HalftoneBrush {
-public:
+ public:
   HalftoneBrush() {
     const WORD pattern[8] = {0x5555, 0xAAAA, 0x5555, 0xAAAA, 0x5555, 0xAAAA, 0x5555, 0xAAAA};
     m_bitmap = ::CreateBitmap(8, 8, 1, 1, pattern);
@@ -24,7 +24,7 @@ public:
   HalftoneBrush &operator=(const HalftoneBrush &) = delete;
   HBRUSH get() const { return m_brush; }
 
-private:
+ private:
   HBITMAP m_bitmap = nullptr;
   HBRUSH m_brush = nullptr;
 };
@@ -49,8 +49,7 @@ BOOL CSplitterWnd::CreateView(int row, int col, std::unique_ptr<CView> view, SIZ
   colInfo.idealSize = initialSize.cx;
   rowInfo.idealSize = initialSize.cy;
   const RECT rect{0, 0, initialSize.cx, initialSize.cy};
-  if (!view->Create(nullptr, nullptr, WS_CHILD | WS_VISIBLE, rect, this, static_cast<UINT>(IdFromRowCol(row, col))))
-    return FALSE;
+  if (!view->Create(nullptr, nullptr, WS_CHILD | WS_VISIBLE, rect, this, static_cast<UINT>(IdFromRowCol(row, col)))) return FALSE;
   m_views[slot] = std::move(view);
   return TRUE;
 }
@@ -252,51 +251,51 @@ void CSplitterWnd::StopTracking(bool accept) {
 LRESULT CSplitterWnd::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
   const POINT pt{static_cast<short>(LOWORD(lParam)), static_cast<short>(HIWORD(lParam))};
   switch (message) {
-  case WM_SIZE:
-    if (wParam != SIZE_MINIMIZED) RecalcLayout();
-    break;
-  case WM_PAINT: OnPaint(); return 0;
-  case WM_SETCURSOR:
-    if (reinterpret_cast<HWND>(wParam) == m_hWnd && LOWORD(lParam) == HTCLIENT) {
-      POINT cursor;
-      ::GetCursorPos(&cursor);
-      ::ScreenToClient(m_hWnd, &cursor);
-      const Hit hit = HitTest(cursor);
-      if (hit.index >= 0) {
-        ::SetCursor(::LoadCursor(nullptr, hit.vertical ? IDC_SIZEWE : IDC_SIZENS));
-        return TRUE;
+    case WM_SIZE:
+      if (wParam != SIZE_MINIMIZED) RecalcLayout();
+      break;
+    case WM_PAINT: OnPaint(); return 0;
+    case WM_SETCURSOR:
+      if (reinterpret_cast<HWND>(wParam) == m_hWnd && LOWORD(lParam) == HTCLIENT) {
+        POINT cursor;
+        ::GetCursorPos(&cursor);
+        ::ScreenToClient(m_hWnd, &cursor);
+        const Hit hit = HitTest(cursor);
+        if (hit.index >= 0) {
+          ::SetCursor(::LoadCursor(nullptr, hit.vertical ? IDC_SIZEWE : IDC_SIZENS));
+          return TRUE;
+        }
       }
-    }
-    break;
-  case WM_LBUTTONDOWN:
-    if (const Hit hit = HitTest(pt); !m_bTracking && hit.index >= 0) {
-      StartTracking(hit, pt);
-      return 0;
-    }
-    break;
-  case WM_MOUSEMOVE:
-    if (m_bTracking) {
-      MoveTracker(pt);
-      return 0;
-    }
-    break;
-  case WM_LBUTTONUP:
-    if (m_bTracking) {
-      StopTracking(true);
-      return 0;
-    }
-    break;
-  case WM_KEYDOWN:
-    if (m_bTracking && wParam == VK_ESCAPE) {
-      StopTracking(false);
-      return 0;
-    }
-    break;
-  case WM_CANCELMODE: StopTracking(false); break;
-  case WM_CAPTURECHANGED:
-    if (reinterpret_cast<HWND>(lParam) != m_hWnd) StopTracking(false);
-    break;
-  default: break;
+      break;
+    case WM_LBUTTONDOWN:
+      if (const Hit hit = HitTest(pt); !m_bTracking && hit.index >= 0) {
+        StartTracking(hit, pt);
+        return 0;
+      }
+      break;
+    case WM_MOUSEMOVE:
+      if (m_bTracking) {
+        MoveTracker(pt);
+        return 0;
+      }
+      break;
+    case WM_LBUTTONUP:
+      if (m_bTracking) {
+        StopTracking(true);
+        return 0;
+      }
+      break;
+    case WM_KEYDOWN:
+      if (m_bTracking && wParam == VK_ESCAPE) {
+        StopTracking(false);
+        return 0;
+      }
+      break;
+    case WM_CANCELMODE: StopTracking(false); break;
+    case WM_CAPTURECHANGED:
+      if (reinterpret_cast<HWND>(lParam) != m_hWnd) StopTracking(false);
+      break;
+    default: break;
   }
   return CWnd::WindowProc(message, wParam, lParam);
 }

@@ -13,9 +13,8 @@
 namespace fw {
 
 class CSplitterWnd : public CWnd {
-public:
-  BOOL CreateStatic(CWnd *parent, int rows, int cols, DWORD style = WS_CHILD | WS_VISIBLE,
-                    UINT id = AFX_IDW_PANE_FIRST);
+ public:
+  BOOL CreateStatic(CWnd *parent, int rows, int cols, DWORD style = WS_CHILD | WS_VISIBLE, UINT id = AFX_IDW_PANE_FIRST);
   // Creates the pane at (row, col) from view, initialSize giving the pane's ideal width and
   // height. On failure the view object is destroyed.
   BOOL CreateView(int row, int col, std::unique_ptr<CView> view, SIZE initialSize);
@@ -45,11 +44,11 @@ public:
   static constexpr int kBorder = 2;
   static constexpr int kSplitterGap = 7;
 
-protected:
+ protected:
   BOOL OnCommand(WPARAM wParam, LPARAM lParam) override;
   BOOL OnNotify(WPARAM wParam, LPARAM lParam, LRESULT *result) override;
 
-private:
+ private:
   struct RowColInfo {
     int minSize = 0;
     int idealSize = 0;

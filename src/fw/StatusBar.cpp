@@ -13,10 +13,10 @@ constexpr int kPanePadding = 10;  // text margins and the pane's own border
 
 int KeyOfIndicator(UINT id) {
   switch (id) {
-  case ID_INDICATOR_CAPS: return VK_CAPITAL;
-  case ID_INDICATOR_NUM: return VK_NUMLOCK;
-  case ID_INDICATOR_SCRL: return VK_SCROLL;
-  default: return 0;
+    case ID_INDICATOR_CAPS: return VK_CAPITAL;
+    case ID_INDICATOR_NUM: return VK_NUMLOCK;
+    case ID_INDICATOR_SCRL: return VK_SCROLL;
+    default: return 0;
   }
 }
 
@@ -24,16 +24,16 @@ std::string IndicatorText(UINT id) {
   std::string text = AfxLoadString(id);
   if (!text.empty()) return text;
   switch (id) {
-  case ID_INDICATOR_CAPS: return "CAP";
-  case ID_INDICATOR_NUM: return "NUM";
-  case ID_INDICATOR_SCRL: return "SCRL";
-  default: return {};
+    case ID_INDICATOR_CAPS: return "CAP";
+    case ID_INDICATOR_NUM: return "NUM";
+    case ID_INDICATOR_SCRL: return "SCRL";
+    default: return {};
   }
 }
 
 // The font the control draws with, selected into a device context of it for measuring.
 class MeasuringDC {
-public:
+ public:
   explicit MeasuringDC(HWND window) : m_window(window), m_dc(::GetDC(window)) {
     HFONT font = reinterpret_cast<HFONT>(::SendMessageA(window, WM_GETFONT, 0, 0));
     if (!font) font = static_cast<HFONT>(::GetStockObject(DEFAULT_GUI_FONT));
@@ -48,14 +48,14 @@ public:
   MeasuringDC &operator=(const MeasuringDC &) = delete;
   HDC get() const { return m_dc; }
 
-private:
+ private:
   HWND m_window;
   HDC m_dc;
   HGDIOBJ m_previous = nullptr;
 };
 
 class CStatusCmdUI : public CCmdUI {
-public:
+ public:
   CStatusCmdUI(CStatusBar &bar, UINT index, UINT id) : m_bar(bar) {
     m_nIndex = index;
     m_nID = id;
@@ -70,7 +70,7 @@ public:
   }
   void SetText(const std::string &text) override { m_bar.SetPaneText(static_cast<int>(m_nIndex), text); }
 
-private:
+ private:
   CStatusBar &m_bar;
 };
 }  // namespace

@@ -20,7 +20,7 @@ constexpr UINT SBPS_DISABLED = 0x04000000;
 constexpr UINT SBPS_STRETCH = 0x08000000;
 
 class CStatusBar : public CControlBar {
-public:
+ public:
   BOOL Create(CWnd *parent, DWORD style = WS_CHILD | WS_VISIBLE | CBRS_BOTTOM, UINT id = AFX_IDW_STATUS_BAR);
   // One pane per id. An indicator's text is its string; CAP, NUM and SCRL default to those words.
   BOOL SetIndicators(const UINT *ids, int count);
@@ -42,7 +42,7 @@ public:
   void OnUpdateCmdUI(CWnd *target) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
-private:
+ private:
   struct PaneInfo {
     UINT id = 0;
     UINT style = SBPS_NORMAL;

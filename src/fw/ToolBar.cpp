@@ -10,8 +10,8 @@ namespace fw {
 namespace {
 constexpr WORD kToolBarResourceType = 241;
 constexpr COLORREF kButtonFaceInPictures = RGB(192, 192, 192);
-constexpr int kEdge = 2;        // a CBRS_BORDER_* side
-constexpr int kGripper = 7;     // the gripper and the space around it
+constexpr int kEdge = 2;     // a CBRS_BORDER_* side
+constexpr int kGripper = 7;  // the gripper and the space around it
 constexpr int kFlatSeparator = 6;
 
 // The tip part of a command's "prompt\ntip" string; empty when there is none.
@@ -22,7 +22,7 @@ std::string ToolTipOf(UINT id) {
 }
 
 class CToolCmdUI : public CCmdUI {
-public:
+ public:
   CToolCmdUI(const CToolBar &bar, UINT index, UINT id) : m_bar(bar) {
     m_nIndex = index;
     m_nID = id;
@@ -33,7 +33,7 @@ public:
     m_bar.SendMessage(TB_INDETERMINATE, m_nID, MAKELPARAM(check == 2, 0));
   }
 
-private:
+ private:
   const CToolBar &m_bar;
 };
 }  // namespace
@@ -68,8 +68,8 @@ BOOL CToolBar::LoadToolBar(UINT resourceId) {
   if (size < (4 + count) * sizeof(WORD)) return FALSE;
   const std::vector<UINT> ids(data + 4, data + 4 + count);
 
-  HBITMAP images = static_cast<HBITMAP>(
-      ::LoadImageA(module, MAKEINTRESOURCEA(resourceId), IMAGE_BITMAP, 0, 0, LR_CREATEDIBSECTION));
+  HBITMAP images =
+      static_cast<HBITMAP>(::LoadImageA(module, MAKEINTRESOURCEA(resourceId), IMAGE_BITMAP, 0, 0, LR_CREATEDIBSECTION));
   if (!images) return FALSE;
   const BOOL loadedButtons = LoadToolBar(SIZE{data[1], data[2]}, ids, images);
   ::DeleteObject(images);
@@ -106,9 +106,7 @@ BOOL CToolBar::LoadToolBar(SIZE imageSize, const std::vector<UINT> &ids, HBITMAP
     }
     buttons.push_back(button);
   }
-  if (!buttons.empty() &&
-      !SendMessage(TB_ADDBUTTONSA, buttons.size(), reinterpret_cast<LPARAM>(buttons.data())))
-    return FALSE;
+  if (!buttons.empty() && !SendMessage(TB_ADDBUTTONSA, buttons.size(), reinterpret_cast<LPARAM>(buttons.data()))) return FALSE;
   Invalidate();
   return TRUE;
 }
@@ -245,32 +243,32 @@ void CToolBar::OnFlyBy(int index) {
 
 LRESULT CToolBar::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
-  case WM_NCCALCSIZE: {
-    const LRESULT result = Default();
-    RECT *client = wParam ? &reinterpret_cast<NCCALCSIZE_PARAMS *>(lParam)->rgrc[0] : reinterpret_cast<RECT *>(lParam);
-    const RECT insets = NonClientInsets();
-    client->left += insets.left;
-    client->top += insets.top;
-    client->right = std::max(client->left, client->right - insets.right);
-    client->bottom = std::max(client->top, client->bottom - insets.bottom);
-    return result;
-  }
-  case WM_NCPAINT: OnNcPaint(); return 0;
-  case WM_NOTIFY: {
-    auto *header = reinterpret_cast<NMHDR *>(lParam);
-    if ((header->code == TTN_GETDISPINFOA || header->code == TTN_GETDISPINFOW) && OnToolTipText(header)) return 0;
-    break;
-  }
-  case WM_MOUSEMOVE:
-    if (m_dwStyle & CBRS_FLYBY) {
-      POINT pt{static_cast<short>(LOWORD(lParam)), static_cast<short>(HIWORD(lParam))};
-      OnFlyBy(static_cast<int>(SendMessage(TB_HITTEST, 0, reinterpret_cast<LPARAM>(&pt))));
+    case WM_NCCALCSIZE: {
+      const LRESULT result = Default();
+      RECT *client = wParam ? &reinterpret_cast<NCCALCSIZE_PARAMS *>(lParam)->rgrc[0] : reinterpret_cast<RECT *>(lParam);
+      const RECT insets = NonClientInsets();
+      client->left += insets.left;
+      client->top += insets.top;
+      client->right = std::max(client->left, client->right - insets.right);
+      client->bottom = std::max(client->top, client->bottom - insets.bottom);
+      return result;
     }
-    break;
-  case WM_MOUSELEAVE:
-    if (m_dwStyle & CBRS_FLYBY) OnFlyBy(-1);
-    break;
-  default: break;
+    case WM_NCPAINT: OnNcPaint(); return 0;
+    case WM_NOTIFY: {
+      auto *header = reinterpret_cast<NMHDR *>(lParam);
+      if ((header->code == TTN_GETDISPINFOA || header->code == TTN_GETDISPINFOW) && OnToolTipText(header)) return 0;
+      break;
+    }
+    case WM_MOUSEMOVE:
+      if (m_dwStyle & CBRS_FLYBY) {
+        POINT pt{static_cast<short>(LOWORD(lParam)), static_cast<short>(HIWORD(lParam))};
+        OnFlyBy(static_cast<int>(SendMessage(TB_HITTEST, 0, reinterpret_cast<LPARAM>(&pt))));
+      }
+      break;
+    case WM_MOUSELEAVE:
+      if (m_dwStyle & CBRS_FLYBY) OnFlyBy(-1);
+      break;
+    default: break;
   }
   return CControlBar::WindowProc(message, wParam, lParam);
 }

@@ -20,15 +20,14 @@ constexpr UINT TBBS_SEPARATOR = TBSTYLE_SEP;
 constexpr UINT TBBS_CHECKBOX = TBSTYLE_CHECK;
 
 class CToolBar : public CControlBar {
-public:
+ public:
   CToolBar() = default;
   ~CToolBar() override;
 
   // ctrlStyle: tool bar control styles (TBSTYLE_FLAT); style: window styles and CBRS_ bar
   // styles; borders: extra space around the buttons inside the bar.
-  BOOL CreateEx(CWnd *parent, DWORD ctrlStyle = TBSTYLE_FLAT,
-                DWORD style = WS_CHILD | WS_VISIBLE | CBRS_ALIGN_TOP, RECT borders = RECT{0, 0, 0, 0},
-                UINT id = AFX_IDW_TOOLBAR);
+  BOOL CreateEx(CWnd *parent, DWORD ctrlStyle = TBSTYLE_FLAT, DWORD style = WS_CHILD | WS_VISIBLE | CBRS_ALIGN_TOP,
+                RECT borders = RECT{0, 0, 0, 0}, UINT id = AFX_IDW_TOOLBAR);
   // Buttons and pictures of tool bar resource `resourceId` of the current resource module.
   BOOL LoadToolBar(UINT resourceId);
   // The same from data already read: image size, ids (0 = separator), and the strip of images.
@@ -57,7 +56,7 @@ public:
   void OnUpdateCmdUI(CWnd *target) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
-private:
+ private:
   // Space the bar keeps around the control's buttons: borders, edges and the gripper.
   RECT NonClientInsets() const;
   void OnNcPaint();

@@ -83,21 +83,21 @@ LRESULT CView::OnMouseActivate() {
 
 LRESULT CView::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
-  case WM_PAINT: {
-    PAINTSTRUCT paint;
-    HDC dc = ::BeginPaint(m_hWnd, &paint);
-    OnPrepareDC(dc);
-    OnDraw(dc);
-    ::EndPaint(m_hWnd, &paint);
-    return 0;
-  }
-  case WM_MOUSEACTIVATE: return OnMouseActivate();
-  case WM_INITIALUPDATE: OnInitialUpdate(); return 0;
-  case WM_DESTROY:
-    // The frame must not keep routing commands to a view that is going away.
-    if (CFrameWnd *frame = GetParentFrame(); frame && frame->GetActiveView() == this) frame->SetActiveView(nullptr);
-    break;
-  default: break;
+    case WM_PAINT: {
+      PAINTSTRUCT paint;
+      HDC dc = ::BeginPaint(m_hWnd, &paint);
+      OnPrepareDC(dc);
+      OnDraw(dc);
+      ::EndPaint(m_hWnd, &paint);
+      return 0;
+    }
+    case WM_MOUSEACTIVATE: return OnMouseActivate();
+    case WM_INITIALUPDATE: OnInitialUpdate(); return 0;
+    case WM_DESTROY:
+      // The frame must not keep routing commands to a view that is going away.
+      if (CFrameWnd *frame = GetParentFrame(); frame && frame->GetActiveView() == this) frame->SetActiveView(nullptr);
+      break;
+    default: break;
   }
   return CWnd::WindowProc(message, wParam, lParam);
 }
@@ -185,14 +185,24 @@ void CScrollView::UpdateBars() {
 
   ::ShowScrollBar(m_hWnd, SB_HORZ, needHorz);
   if (needHorz) {
-    SCROLLINFO info{sizeof(info), SIF_RANGE | SIF_PAGE, 0, static_cast<int>(m_totalDev.cx - 1),
-                    static_cast<UINT>(std::max(0L, size.cx)), 0, 0};
+    SCROLLINFO info{sizeof(info),
+                    SIF_RANGE | SIF_PAGE,
+                    0,
+                    static_cast<int>(m_totalDev.cx - 1),
+                    static_cast<UINT>(std::max(0L, size.cx)),
+                    0,
+                    0};
     ::SetScrollInfo(m_hWnd, SB_HORZ, &info, TRUE);
   }
   ::ShowScrollBar(m_hWnd, SB_VERT, needVert);
   if (needVert) {
-    SCROLLINFO info{sizeof(info), SIF_RANGE | SIF_PAGE, 0, static_cast<int>(m_totalDev.cy - 1),
-                    static_cast<UINT>(std::max(0L, size.cy)), 0, 0};
+    SCROLLINFO info{sizeof(info),
+                    SIF_RANGE | SIF_PAGE,
+                    0,
+                    static_cast<int>(m_totalDev.cy - 1),
+                    static_cast<UINT>(std::max(0L, size.cy)),
+                    0,
+                    0};
     ::SetScrollInfo(m_hWnd, SB_VERT, &info, TRUE);
   }
   m_bInsideUpdate = false;
@@ -201,14 +211,14 @@ void CScrollView::UpdateBars() {
 BOOL CScrollView::OnScroll(UINT scrollCode, UINT pos, BOOL doScroll) {
   const auto target = [&](BYTE code, int current, int page, int line) {
     switch (code) {
-    case SB_TOP: return 0;
-    case SB_BOTTOM: return INT_MAX;
-    case SB_LINEUP: return current - line;
-    case SB_LINEDOWN: return current + line;
-    case SB_PAGEUP: return current - page;
-    case SB_PAGEDOWN: return current + page;
-    case SB_THUMBTRACK: return static_cast<int>(pos);
-    default: return current;
+      case SB_TOP: return 0;
+      case SB_BOTTOM: return INT_MAX;
+      case SB_LINEUP: return current - line;
+      case SB_LINEDOWN: return current + line;
+      case SB_PAGEUP: return current - page;
+      case SB_PAGEDOWN: return current + page;
+      case SB_THUMBTRACK: return static_cast<int>(pos);
+      default: return current;
     }
   };
   const POINT from = GetDeviceScrollPosition();
@@ -226,10 +236,8 @@ BOOL CScrollView::OnScrollBy(SIZE sizeScroll, BOOL doScroll) {
   if (!(style & WS_HSCROLL)) sizeScroll.cx = 0;
 
   const POINT from = GetDeviceScrollPosition();
-  const int x = Clamp(static_cast<int>(std::min<long long>(INT_MAX, 0LL + from.x + sizeScroll.cx)), 0,
-                      ScrollLimit(SB_HORZ));
-  const int y = Clamp(static_cast<int>(std::min<long long>(INT_MAX, 0LL + from.y + sizeScroll.cy)), 0,
-                      ScrollLimit(SB_VERT));
+  const int x = Clamp(static_cast<int>(std::min<long long>(INT_MAX, 0LL + from.x + sizeScroll.cx)), 0, ScrollLimit(SB_HORZ));
+  const int y = Clamp(static_cast<int>(std::min<long long>(INT_MAX, 0LL + from.y + sizeScroll.cy)), 0, ScrollLimit(SB_VERT));
   if (x == from.x && y == from.y) return FALSE;
   if (doScroll) {
     ::ScrollWindow(m_hWnd, from.x - x, from.y - y, nullptr, nullptr);
@@ -267,24 +275,24 @@ void CScrollView::OnPrepareDC(HDC dc) {
 
 LRESULT CScrollView::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
-  case WM_HSCROLL:
-  case WM_VSCROLL:
-    // A scroll bar control's message goes to that control (reflection); the view's own bars scroll it.
-    if (lParam) break;
-    if (message == WM_VSCROLL)
-      OnScroll(MAKEWORD(0xFF, LOWORD(wParam)), HIWORD(wParam));
-    else
-      OnScroll(MAKEWORD(LOWORD(wParam), 0xFF), HIWORD(wParam));
-    return 0;
-  case WM_MOUSEWHEEL:
-    if (OnMouseWheel(GET_WHEEL_DELTA_WPARAM(wParam))) return 0;
-    break;
-  case WM_SIZE: {
-    const LRESULT result = CView::WindowProc(message, wParam, lParam);
-    if (m_nMapMode) UpdateBars();
-    return result;
-  }
-  default: break;
+    case WM_HSCROLL:
+    case WM_VSCROLL:
+      // A scroll bar control's message goes to that control (reflection); the view's own bars scroll it.
+      if (lParam) break;
+      if (message == WM_VSCROLL)
+        OnScroll(MAKEWORD(0xFF, LOWORD(wParam)), HIWORD(wParam));
+      else
+        OnScroll(MAKEWORD(LOWORD(wParam), 0xFF), HIWORD(wParam));
+      return 0;
+    case WM_MOUSEWHEEL:
+      if (OnMouseWheel(GET_WHEEL_DELTA_WPARAM(wParam))) return 0;
+      break;
+    case WM_SIZE: {
+      const LRESULT result = CView::WindowProc(message, wParam, lParam);
+      if (m_nMapMode) UpdateBars();
+      return result;
+    }
+    default: break;
   }
   return CView::WindowProc(message, wParam, lParam);
 }

@@ -13,7 +13,7 @@ class CFrameWnd;
 constexpr UINT WM_INITIALUPDATE = 0x0364;
 
 class CView : public CWnd {
-public:
+ public:
   // Creates the view window; PreCreateWindow may change the creation values first.
   virtual BOOL Create(LPCSTR className, LPCSTR windowName, DWORD style, const RECT &rect, CWnd *parent, UINT id);
   // The base gives views the framework's view class and turns WS_BORDER into a sunken edge.
@@ -31,7 +31,7 @@ public:
 
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
-private:
+ private:
   LRESULT OnMouseActivate();
 };
 
@@ -39,7 +39,7 @@ private:
 // (pixels): scroll bar positions are the scroll position, and scrolling moves the window's
 // content together with its child windows.
 class CScrollView : public CView {
-public:
+ public:
   // Page and line sizes of zero mean a tenth of the total and a tenth of the page.
   static constexpr SIZE sizeDefault{0, 0};
 
@@ -60,12 +60,12 @@ public:
   void OnPrepareDC(HDC dc) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
-protected:
+ protected:
   // Shows the scroll bars the total size needs at the current window size, sets their ranges
   // and pages, and scrolls back when the position lies beyond the new range.
   void UpdateBars();
 
-private:
+ private:
   int ScrollLimit(int bar) const;
   void ScrollToDevicePosition(POINT pt);
   BOOL OnMouseWheel(short delta);

@@ -29,6 +29,14 @@ void COmbra3View::GetPictureSize(int &width, int &height) const {
   height = m_nPictureHeight;
 }
 
+void COmbra3View::ReloadFolder() {
+  if (g_pMainFrame && g_pDoc) {
+    g_pMainFrame->SetWindowText(g_pDoc->m_strPath);
+    g_pMainFrame->UpdateLayerLabel();
+  }
+  ResetAndBuild(TRUE);
+}
+
 void COmbra3View::ResetAndBuild(BOOL sort) {
   if (sort && g_pMainFrame) SortRecords(*g_pCatalogue, g_pMainFrame->m_nSortKey);
   ScrollToPosition(POINT{0, 0});

@@ -10,6 +10,9 @@ public:
 
   // Picture size of the tiles: the remembered one when both values are non-zero.
   void GetPictureSize(int &width, int &height) const;
+  // Shows a freshly scanned catalogue: the folder in the frame's title, its layer in the frame's
+  // label, then sorted and laid out from the first row.
+  void ReloadFolder();
   // Lays out from the first row, sorting the catalogue by the frame's key first when asked.
   void ResetAndBuild(BOOL sort);
   void SelectAll();

@@ -3,6 +3,7 @@
 #include "ExplorerHarness.h"
 
 #include <gtest/gtest.h>
+#include <shlobj.h>
 
 #include <cstdlib>
 
@@ -33,6 +34,9 @@ void Command(HWND frame, int id) { PostMessageA(frame, WM_COMMAND, id, 0); }
 
 class ExplorerFrame : public ::testing::Test {
 protected:
+  // The host runs with OLE initialised on its thread, as the CAD application does.
+  static void SetUpTestSuite() { OleInitialize(nullptr); }
+  static void TearDownTestSuite() { OleUninitialize(); }
   void SetUp() override { ASSERT_EQ(m_module.LoadResult(), kDevhostLoaded); }
   StateFileGuard m_state;
   LoadedModule m_module;
@@ -235,5 +239,157 @@ TEST_F(ExplorerFrame, EscapeInAPaneCancels) {
     PostMessageA(left, WM_KEYDOWN, VK_ESCAPE, 0);
   });
   EXPECT_EQ(outcome.resultKind, RTNIL);
+}
+}  // namespace
+
+namespace {
+constexpr int kAppExit = 0xE141;
+constexpr int kAppAbout = 0xE140;
+constexpr int kViewToolbar = 0xE800;
+constexpr int kViewStatusBar = 0xE801;
+constexpr int kEditCopy = 0xE122;
+constexpr int kEditCut = 0xE123;
+constexpr int kEditPaste = 0xE125;
+
+std::string TempFolder(const std::string &name) {
+  char temp[MAX_PATH];
+  GetTempPathA(MAX_PATH, temp);
+  const std::string folder = std::string(temp) + name;
+  CreateDirectoryA(folder.c_str(), nullptr);
+  return folder;
+}
+
+void PutFileListOnClipboard(const std::string &path) {
+  const size_t bytes = sizeof(DROPFILES) + path.size() + 2;
+  HGLOBAL block = GlobalAlloc(GMEM_MOVEABLE | GMEM_ZEROINIT, bytes);
+  auto *drop = static_cast<DROPFILES *>(GlobalLock(block));
+  drop->pFiles = sizeof(DROPFILES);
+  memcpy(reinterpret_cast<char *>(drop) + sizeof(DROPFILES), path.c_str(), path.size());
+  GlobalUnlock(block);
+  OpenClipboard(nullptr);
+  EmptyClipboard();
+  SetClipboardData(CF_HDROP, block);
+  CloseClipboard();
+}
+
+void PutTextOnClipboard(const char *text) {
+  HGLOBAL block = GlobalAlloc(GMEM_MOVEABLE, strlen(text) + 1);
+  memcpy(GlobalLock(block), text, strlen(text) + 1);
+  GlobalUnlock(block);
+  OpenClipboard(nullptr);
+  EmptyClipboard();
+  SetClipboardData(CF_TEXT, block);
+  CloseClipboard();
+}
+
+TEST_F(ExplorerFrame, FileExitCancels) {
+  EXPECT_EQ(Browse(BrowseArgs(L""), [](HWND frame) { Command(frame, kAppExit); }).resultKind, RTNIL);
+}
+
+TEST_F(ExplorerFrame, ToolBarAndStatusBarCommandsHideThemAndClearTheirCheckMarks) {
+  bool topVisible = true, statusVisible = true, toolbarChecked = true, statusChecked = true, bottomVisible = false;
+  Browse(BrowseArgs(L""), [&](HWND frame) {
+    const std::vector<HWND> bars = ToolBars(frame);
+    HWND status = FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr);
+    SendMessageA(frame, WM_COMMAND, kViewToolbar, 0);
+    SendMessageA(frame, WM_COMMAND, kViewStatusBar, 0);
+    HMENU view = GetSubMenu(GetMenu(frame), 1);
+    SendMessageA(frame, WM_INITMENUPOPUP, reinterpret_cast<WPARAM>(view), 1);
+    toolbarChecked = GetMenuState(view, kViewToolbar, MF_BYCOMMAND) & MF_CHECKED;
+    statusChecked = GetMenuState(view, kViewStatusBar, MF_BYCOMMAND) & MF_CHECKED;
+    topVisible = bars.size() == 2 && IsWindowVisible(bars[0]);
+    bottomVisible = bars.size() == 2 && IsWindowVisible(bars[1]);
+    statusVisible = IsWindowVisible(status);
+    Command(frame, kCancel);
+  });
+  EXPECT_FALSE(topVisible);
+  EXPECT_TRUE(bottomVisible) << "the toggle is the top tool bar's";
+  EXPECT_FALSE(statusVisible);
+  EXPECT_FALSE(toolbarChecked);
+  EXPECT_FALSE(statusChecked);
+}
+
+TEST_F(ExplorerFrame, AboutBoxRunsModallyOverTheFrame) {
+  std::string title;
+  bool frameEnabledDuringAbout = true;
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    Command(frame, kAppAbout);
+    if (HWND about = WaitForWindow("#32770", "About Lumvex1", 5000)) {
+      title = WindowText(about);
+      frameEnabledDuringAbout = IsWindowEnabled(frame);
+      PostMessageA(about, WM_COMMAND, IDOK, 0);
+      for (int i = 0; i < 100 && IsWindow(about); ++i) Sleep(20);
+    }
+    Command(frame, kCancel);
+  });
+  EXPECT_EQ(title, "About Lumvex1");
+  EXPECT_FALSE(frameEnabledDuringAbout);
+  EXPECT_EQ(outcome.resultKind, RTNIL);
+}
+
+TEST_F(ExplorerFrame, CopyWithNothingMarkedPutsAnEmptyFileList) {
+  PutTextOnClipboard("before");
+  Browse(BrowseArgs(L""), [](HWND frame) {
+    SendMessageA(frame, WM_COMMAND, kEditCopy, 0);
+    Command(frame, kCancel);
+  });
+  ASSERT_TRUE(OpenClipboard(nullptr));
+  HGLOBAL block = GetClipboardData(CF_HDROP);
+  ASSERT_NE(block, nullptr);
+  const auto *drop = static_cast<const DROPFILES *>(GlobalLock(block));
+  EXPECT_EQ(drop->pFiles, 20u);
+  EXPECT_FALSE(drop->fWide);
+  EXPECT_EQ(*(reinterpret_cast<const char *>(drop) + drop->pFiles), '\0') << "no file in the list";
+  GlobalUnlock(block);
+  CloseClipboard();
+}
+
+TEST_F(ExplorerFrame, CutLeavesTheClipboardAlone) {
+  PutTextOnClipboard("kept");
+  Browse(BrowseArgs(L""), [](HWND frame) {
+    SendMessageA(frame, WM_COMMAND, kEditCut, 0);
+    Command(frame, kCancel);
+  });
+  ASSERT_TRUE(OpenClipboard(nullptr));
+  EXPECT_FALSE(IsClipboardFormatAvailable(CF_HDROP));
+  HGLOBAL text = GetClipboardData(CF_TEXT);
+  ASSERT_NE(text, nullptr);
+  EXPECT_STREQ(static_cast<const char *>(GlobalLock(text)), "kept");
+  GlobalUnlock(text);
+  CloseClipboard();
+}
+
+TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheLabel) {
+  const std::string source = TempFolder("lumvex-paste-source");
+  std::ofstream(source + "\\door.dwg", std::ios::binary) << "AC1018";
+  struct Case {
+    const char *settings;  // nullptr: no datains.ini
+    const char *label;
+  };
+  for (const Case &c : {Case{nullptr, " Layer name: Current"}, Case{"[Default Parameters]\r\nLayer=\r\nColor=3\r\n", " Layer name: Current"},
+                        Case{"[Default Parameters]\r\nLayer=WALLS\r\n", " Layer name: WALLS"}}) {
+    const std::string folder = TempFolder("lumvex-paste-target");
+    if (c.settings) std::ofstream(folder + "\\datains.ini", std::ios::binary) << c.settings;
+    m_state.Write(StateFile(0, 0, 0, folder));
+    SetCurrentDirectoryA(folder.c_str());
+    PutFileListOnClipboard(source + "\\door.dwg");
+    std::string label, title;
+    Browse(BrowseArgs(L""), [&](HWND frame) {
+      SendMessageA(frame, WM_COMMAND, kEditPaste, 0);
+      const std::vector<HWND> bars = ToolBars(frame);
+      if (!bars.empty()) label = WindowText(Children(bars[0], "STATIC").back());
+      title = WindowText(frame);
+      Command(frame, kCancel);
+    });
+    SetCurrentDirectoryA(StateFileGuard::Narrow(ProgramFolder()).c_str());
+    EXPECT_EQ(label, c.label);
+    EXPECT_EQ(title, folder);
+    EXPECT_NE(GetFileAttributesA((folder + "\\door.dwg").c_str()), INVALID_FILE_ATTRIBUTES) << "the drawing was pasted";
+    DeleteFileA((folder + "\\door.dwg").c_str());
+    DeleteFileA((folder + "\\datains.ini").c_str());
+    RemoveDirectoryA(folder.c_str());
+  }
+  DeleteFileA((source + "\\door.dwg").c_str());
+  RemoveDirectoryA(source.c_str());
 }
 }  // namespace

@@ -22,23 +22,23 @@ using fwtest::Pump;
 
 std::string NotificationName(UINT code) {
   switch (code) {
-  case EN_CHANGE: return "EN_CHANGE";
-  case STN_CLICKED: return "STN_CLICKED";
-  case TVN_SELCHANGINGA:
-  case TVN_SELCHANGINGW: return "TVN_SELCHANGING";
-  case TVN_SELCHANGEDA:
-  case TVN_SELCHANGEDW: return "TVN_SELCHANGED";
-  case TVN_ITEMEXPANDINGA:
-  case TVN_ITEMEXPANDINGW: return "TVN_ITEMEXPANDING";
-  case TVN_ITEMEXPANDEDA:
-  case TVN_ITEMEXPANDEDW: return "TVN_ITEMEXPANDED";
-  default: return {};
+    case EN_CHANGE: return "EN_CHANGE";
+    case STN_CLICKED: return "STN_CLICKED";
+    case TVN_SELCHANGINGA:
+    case TVN_SELCHANGINGW: return "TVN_SELCHANGING";
+    case TVN_SELCHANGEDA:
+    case TVN_SELCHANGEDW: return "TVN_SELCHANGED";
+    case TVN_ITEMEXPANDINGA:
+    case TVN_ITEMEXPANDINGW: return "TVN_ITEMEXPANDING";
+    case TVN_ITEMEXPANDEDA:
+    case TVN_ITEMEXPANDEDW: return "TVN_ITEMEXPANDED";
+    default: return {};
   }
 }
 
 // The parent: records what command routing and the bars' prompts bring to it.
 class Parent : public fwtest::TopWindow {
-public:
+ public:
   BOOL OnCmdMsg(UINT id, int code, fw::CCmdUI *cmdUI) override {
     if (code == fw::CN_UPDATE_COMMAND_UI) {
       for (UINT disabled : disabledCommands)
@@ -65,7 +65,7 @@ public:
 };
 
 class Edit : public fw::CEdit {
-public:
+ public:
   explicit Edit(Log &log) : m_log(log) {}
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override {
     if (m_log.empty() && !firstMessage) firstMessage = message;
@@ -91,7 +91,7 @@ public:
   bool takesNotifications = true;
   HBRUSH brush = nullptr;
 
-private:
+ private:
   Log &m_log;
 };
 
@@ -143,14 +143,14 @@ TEST(FwEditTest, TheControlObjectAnswersItsColourMessageWithItsBrush) {
 }
 
 class Label : public fw::CStatic {
-public:
+ public:
   explicit Label(Log &log) : m_log(log) {}
   BOOL OnChildNotify(UINT message, WPARAM wParam, LPARAM, LRESULT *) override {
     if (message == WM_COMMAND) m_log.push_back("label " + NotificationName(HIWORD(wParam)));
     return message == WM_COMMAND;
   }
 
-private:
+ private:
   Log &m_log;
 };
 
@@ -167,7 +167,7 @@ TEST(FwStaticTest, AClickOnANotifyingStaticReachesTheStaticObject) {
 }
 
 class Tree : public fw::CTreeCtrl {
-public:
+ public:
   explicit Tree(Log &log) : m_log(log) {}
   BOOL OnChildNotify(UINT message, WPARAM, LPARAM lParam, LRESULT *result) override {
     if (message != WM_NOTIFY) return FALSE;
@@ -178,7 +178,7 @@ public:
     return TRUE;
   }
 
-private:
+ private:
   Log &m_log;
 };
 
@@ -186,8 +186,8 @@ TEST(FwTreeCtrlTest, ItemsAndNotificationsReflectedToTheTree) {
   Parent parent;
   ASSERT_TRUE(parent.Create());
   Tree tree(parent.log);
-  ASSERT_TRUE(tree.Create(WS_CHILD | WS_VISIBLE | TVS_HASBUTTONS | TVS_HASLINES | TVS_LINESATROOT,
-                          RECT{0, 0, 300, 300}, &parent, 0xE900));
+  ASSERT_TRUE(tree.Create(WS_CHILD | WS_VISIBLE | TVS_HASBUTTONS | TVS_HASLINES | TVS_LINESATROOT, RECT{0, 0, 300, 300}, &parent,
+                          0xE900));
   const HTREEITEM root = tree.InsertItem("Desktop");
   const HTREEITEM first = tree.InsertItem("My Computer", root);
   const HTREEITEM second = tree.InsertItem("Documents", root);
@@ -207,8 +207,7 @@ TEST(FwTreeCtrlTest, ItemsAndNotificationsReflectedToTheTree) {
   tree.Select(first, TVGN_DROPHILITE);
   EXPECT_EQ(second, tree.GetSelectedItem());
   EXPECT_EQ(first, tree.GetDropHilightItem());
-  EXPECT_EQ((Log{"tree TVN_ITEMEXPANDING", "tree TVN_ITEMEXPANDED", "tree TVN_SELCHANGING", "tree TVN_SELCHANGED"}),
-            parent.log);
+  EXPECT_EQ((Log{"tree TVN_ITEMEXPANDING", "tree TVN_ITEMEXPANDED", "tree TVN_SELCHANGING", "tree TVN_SELCHANGED"}), parent.log);
 
   RECT text{};
   ASSERT_TRUE(tree.GetItemRect(second, &text, TRUE));
@@ -221,7 +220,7 @@ TEST(FwTreeCtrlTest, ItemsAndNotificationsReflectedToTheTree) {
 
 // Tool bars are built from this program's own resources.
 class ToolBarTest : public ::testing::Test {
-protected:
+ protected:
   void SetUp() override {
     fw::AfxSetResourceHandle(GetModuleHandleA(nullptr));
     ASSERT_TRUE(parent.Create());
@@ -338,7 +337,7 @@ TEST_F(ToolBarTest, IdleUpdateRunsHandlersAndLeavesOtherButtonsAsTheyWere) {
 }
 
 class StatusBarTest : public ::testing::Test {
-protected:
+ protected:
   void SetUp() override {
     fw::AfxSetResourceHandle(GetModuleHandleA(nullptr));
     ASSERT_TRUE(parent.Create());
@@ -369,8 +368,8 @@ protected:
 TEST_F(StatusBarTest, PanesFollowTheIndicatorsAndCarryTheirTexts) {
   ASSERT_EQ(4, bar.GetCount());
   EXPECT_EQ(4, static_cast<int>(bar.SendMessage(SB_GETPARTS, 0, 0)));
-  EXPECT_EQ("CAP", bar.GetPaneText(1));     // not in this program's strings: the usual word
-  EXPECT_EQ("NUMLK", bar.GetPaneText(2));   // from the string table
+  EXPECT_EQ("CAP", bar.GetPaneText(1));    // not in this program's strings: the usual word
+  EXPECT_EQ("NUMLK", bar.GetPaneText(2));  // from the string table
   EXPECT_EQ("SCRL", bar.GetPaneText(3));
   EXPECT_EQ(2, bar.CommandToIndex(ID_INDICATOR_NUM));
   EXPECT_THROW(bar.GetPaneText(4), std::out_of_range);

@@ -14,7 +14,7 @@ using fwtest::Log;
 using fwtest::Pump;
 
 class RecordingView : public fw::CScrollView {
-public:
+ public:
   BOOL OnScroll(UINT scrollCode, UINT pos, BOOL doScroll) override {
     char text[40];
     std::snprintf(text, sizeof text, "OnScroll %04X %u", scrollCode, pos);
@@ -34,7 +34,7 @@ public:
 // A 300 pixel high view over content 1600 pixels high, scrolled in steps of 160, with a child
 // window at content position (10, 500).
 class ScrollViewTest : public ::testing::Test {
-protected:
+ protected:
   void SetUp() override {
     ASSERT_TRUE(parent.Create(600, 400));
     ASSERT_TRUE(view.Create(nullptr, nullptr, WS_CHILD | WS_VISIBLE, RECT{0, 0, 400, 300}, &parent, 0xE901));

@@ -17,7 +17,7 @@ using fwtest::Pump;
 using fwtest::ScreenPoint;
 
 class Parent : public fwtest::TopWindow {
-public:
+ public:
   BOOL OnCmdMsg(UINT id, int code, fw::CCmdUI *) override {
     if (code == fw::CN_COMMAND) log.push_back("command " + std::to_string(id));
     return FALSE;
@@ -39,7 +39,7 @@ int ColumnWidth(const fw::CSplitterWnd &splitter, int col) {
 }
 
 class SplitterTest : public ::testing::Test {
-protected:
+ protected:
   void SetUp() override {
     ASSERT_TRUE(parent.Create(600, 400));
     ASSERT_TRUE(splitter.CreateStatic(&parent, 1, 2));
@@ -153,7 +153,7 @@ TEST_F(SplitterTest, CommandsOfThePanesGoOnToTheSplittersParent) {
 
 // A view that records when its frame activates it.
 class ActivatedView : public fw::CView {
-public:
+ public:
   void OnActivateView(BOOL activate, CView *activateView, CView *deactiveView) override {
     ++activations;
     CView::OnActivateView(activate, activateView, deactiveView);
@@ -162,7 +162,7 @@ public:
 };
 
 class Frame : public fw::CFrameWnd {
-public:
+ public:
   BOOL OnCreateClient(CREATESTRUCTA *) override {
     return splitter.CreateStatic(this, 1, 2) && splitter.CreateView<ActivatedView>(0, 0, SIZE{150, 100}) &&
            splitter.CreateView<ActivatedView>(0, 1, SIZE{100, 100});
@@ -172,8 +172,7 @@ public:
 
 TEST(FwViewTest, AClickedViewBecomesItsFramesActiveView) {
   auto *frame = new Frame;  // a frame deletes itself when its window is gone
-  ASSERT_TRUE(frame->CreateEx(0, nullptr, "frame", WS_POPUP | WS_VISIBLE, RECT{40, 40, 640, 440},
-                              static_cast<HWND>(nullptr), 0));
+  ASSERT_TRUE(frame->CreateEx(0, nullptr, "frame", WS_POPUP | WS_VISIBLE, RECT{40, 40, 640, 440}, static_cast<HWND>(nullptr), 0));
   fwtest::InputWindow() = *frame;
   Pump();
   fw::CWnd *left = frame->splitter.GetPane(0, 0);

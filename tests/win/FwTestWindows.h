@@ -94,7 +94,7 @@ inline POINT ScreenPoint(HWND window, int x, int y) {
 // A visible top-level window of the framework's own class at a fixed place on the screen that
 // receives the test's input.
 class TopWindow : public fw::CWnd {
-public:
+ public:
   BOOL Create(int width = 600, int height = 400) {
     const RECT place{40, 40, 40 + width, 40 + height};
     if (!CreateEx(0, nullptr, "fw test", WS_POPUP | WS_VISIBLE | WS_CLIPCHILDREN, place, static_cast<HWND>(nullptr), 0))
