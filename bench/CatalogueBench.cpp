@@ -136,7 +136,8 @@ void BenchSort() {
   for (int i = 0; i < kEntries; ++i) numbers[i] = i;
   std::shuffle(numbers.begin(), numbers.end(), random);
   for (int number : numbers) {
-    shuffled.Add(DwgData(DrawingName(number, random), 1500000000 + static_cast<int64_t>(random() % 300000000), random() % 5000000));
+    shuffled.Add(
+        DwgData(DrawingName(number, random), 1500000000 + static_cast<int64_t>(random() % 300000000), random() % 5000000));
   }
 
   const struct {

@@ -12,25 +12,25 @@ bool CommandInput::Create(HWND parent, int id, SubmitHandler onSubmit) {
 LRESULT CALLBACK CommandInput::SubclassProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR, DWORD_PTR self) {
   auto *input = reinterpret_cast<CommandInput *>(self);
   switch (message) {
-  case WM_GETDLGCODE: return DefSubclassProc(hwnd, message, wParam, lParam) | DLGC_WANTALLKEYS;
-  case WM_KEYDOWN:
-    if (input->OnKey(wParam)) return 0;
-    break;
-  case WM_CHAR:
-    if (wParam == L'\r' || wParam == L'\n') return 0;  // no beep for the Enter already handled
-    break;
-  case WM_NCDESTROY: RemoveWindowSubclass(hwnd, SubclassProc, 1); break;
-  default: break;
+    case WM_GETDLGCODE: return DefSubclassProc(hwnd, message, wParam, lParam) | DLGC_WANTALLKEYS;
+    case WM_KEYDOWN:
+      if (input->OnKey(wParam)) return 0;
+      break;
+    case WM_CHAR:
+      if (wParam == L'\r' || wParam == L'\n') return 0;  // no beep for the Enter already handled
+      break;
+    case WM_NCDESTROY: RemoveWindowSubclass(hwnd, SubclassProc, 1); break;
+    default: break;
   }
   return DefSubclassProc(hwnd, message, wParam, lParam);
 }
 
 bool CommandInput::OnKey(WPARAM key) {
   switch (key) {
-  case VK_RETURN: Submit(); return true;
-  case VK_UP: Recall(-1); return true;
-  case VK_DOWN: Recall(+1); return true;
-  default: return false;
+    case VK_RETURN: Submit(); return true;
+    case VK_UP: Recall(-1); return true;
+    case VK_DOWN: Recall(+1); return true;
+    default: return false;
   }
 }
 

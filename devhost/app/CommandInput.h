@@ -8,13 +8,13 @@
 #include <vector>
 
 class CommandInput {
-public:
+ public:
   using SubmitHandler = std::function<void(const std::wstring &line)>;
 
   bool Create(HWND parent, int id, SubmitHandler onSubmit);
   HWND Handle() const { return m_hwnd; }
 
-private:
+ private:
   static LRESULT CALLBACK SubclassProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam, UINT_PTR id, DWORD_PTR self);
   bool OnKey(WPARAM key);
   void Recall(int step);

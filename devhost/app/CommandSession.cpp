@@ -5,8 +5,7 @@
 #include "lisp/Reader.h"
 
 CommandSession::CommandSession(Writer writer)
-    : m_writer(std::move(writer)),
-      m_evaluator(CallModuleFunction, [this](const std::wstring &text) { Write(text); }) {}
+    : m_writer(std::move(writer)), m_evaluator(CallModuleFunction, [this](const std::wstring &text) { Write(text); }) {}
 
 void CommandSession::Write(const std::wstring &text) {
   if (text.empty()) return;

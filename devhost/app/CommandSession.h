@@ -9,7 +9,7 @@
 #include <string>
 
 class CommandSession {
-public:
+ public:
   using Writer = std::function<void(const std::wstring &text)>;
   explicit CommandSession(Writer writer);
 
@@ -17,7 +17,7 @@ public:
   void Write(const std::wstring &text);
   void Evaluate(const std::wstring &source);
 
-private:
+ private:
   void StartLine();
 
   Writer m_writer;

@@ -15,27 +15,27 @@ struct GdiObjectDelete {
 using GdiObject = std::unique_ptr<std::remove_pointer_t<HGDIOBJ>, GdiObjectDelete>;
 
 class PaintScope {
-public:
+ public:
   explicit PaintScope(HWND hwnd) : m_hwnd(hwnd), m_dc(BeginPaint(hwnd, &m_paint)) {}
   ~PaintScope() { EndPaint(m_hwnd, &m_paint); }
   PaintScope(const PaintScope &) = delete;
   PaintScope &operator=(const PaintScope &) = delete;
   HDC dc() const { return m_dc; }
 
-private:
+ private:
   HWND m_hwnd;
   PAINTSTRUCT m_paint{};
   HDC m_dc;
 };
 
 class SelectedObject {
-public:
+ public:
   SelectedObject(HDC dc, HGDIOBJ object) : m_dc(dc), m_previous(SelectObject(dc, object)) {}
   ~SelectedObject() { SelectObject(m_dc, m_previous); }
   SelectedObject(const SelectedObject &) = delete;
   SelectedObject &operator=(const SelectedObject &) = delete;
 
-private:
+ private:
   HDC m_dc;
   HGDIOBJ m_previous;
 };
@@ -60,10 +60,10 @@ void Paint(HWND hwnd) {
 
 LRESULT CALLBACK ViewProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
-  case WM_PAINT: Paint(hwnd); return 0;
-  case WM_ERASEBKGND: return 1;
-  case WM_LBUTTONDOWN: SetFocus(hwnd); return 0;
-  default: return DefWindowProcW(hwnd, message, wParam, lParam);
+    case WM_PAINT: Paint(hwnd); return 0;
+    case WM_ERASEBKGND: return 1;
+    case WM_LBUTTONDOWN: SetFocus(hwnd); return 0;
+    default: return DefWindowProcW(hwnd, message, wParam, lParam);
   }
 }
 }  // namespace

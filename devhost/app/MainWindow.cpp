@@ -63,15 +63,15 @@ LRESULT CALLBACK MainWindow::FrameProc(HWND hwnd, UINT message, WPARAM wParam, L
   auto *window = reinterpret_cast<MainWindow *>(GetWindowLongPtrW(hwnd, GWLP_USERDATA));
   if (!window) return DefWindowProcW(hwnd, message, wParam, lParam);
   switch (message) {
-  case WM_CREATE: window->CreateChildren(); return 0;
-  case WM_SIZE: window->Layout(); return 0;
-  case WM_SETFOCUS: SetFocus(window->m_input.Handle()); return 0;
-  case WM_CLOSE:
-    if (window->m_onClose) window->m_onClose();
-    DestroyWindow(hwnd);
-    return 0;
-  case WM_DESTROY: PostQuitMessage(0); return 0;
-  default: return DefWindowProcW(hwnd, message, wParam, lParam);
+    case WM_CREATE: window->CreateChildren(); return 0;
+    case WM_SIZE: window->Layout(); return 0;
+    case WM_SETFOCUS: SetFocus(window->m_input.Handle()); return 0;
+    case WM_CLOSE:
+      if (window->m_onClose) window->m_onClose();
+      DestroyWindow(hwnd);
+      return 0;
+    case WM_DESTROY: PostQuitMessage(0); return 0;
+    default: return DefWindowProcW(hwnd, message, wParam, lParam);
   }
 }
 

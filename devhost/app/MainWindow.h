@@ -12,7 +12,7 @@
 #include <string>
 
 class MainWindow {
-public:
+ public:
   using CloseHandler = std::function<void()>;
 
   bool Create(HINSTANCE instance, CommandInput::SubmitHandler onSubmit, CloseHandler onClose);
@@ -21,7 +21,7 @@ public:
   void AppendHistory(const std::wstring &text);
   void Show();
 
-private:
+ private:
   static LRESULT CALLBACK FrameProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam);
   void CreateChildren();
   void Layout();

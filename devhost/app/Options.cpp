@@ -16,8 +16,10 @@ HostOptions ParseOptions(const std::vector<std::wstring> &args) {
     } else if (arg == L"--drawings" && hasValue) {
       wchar_t *end = nullptr;
       const long count = std::wcstol(args[++i].c_str(), &end, 10);
-      if (!end || *end || count < 0 || count > 64) options.error = L"--drawings takes a number from 0 to 64";
-      else options.drawings = static_cast<int>(count);
+      if (!end || *end || count < 0 || count > 64)
+        options.error = L"--drawings takes a number from 0 to 64";
+      else
+        options.drawings = static_cast<int>(count);
     } else {
       options.error = L"unknown or incomplete option: " + arg;
     }

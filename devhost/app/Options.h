@@ -9,7 +9,7 @@ struct HostOptions {
   std::vector<std::wstring> evals;
   std::wstring modulePath;  // empty: Lumvex1.arx beside the program
   int drawings = 1;
-  std::wstring error;       // non-empty when the command line could not be read
+  std::wstring error;  // non-empty when the command line could not be read
 };
 
 HostOptions ParseOptions(const std::vector<std::wstring> &args);

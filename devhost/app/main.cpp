@@ -49,10 +49,10 @@ void ForwardPrinted(const wchar_t *text, void *session) { static_cast<CommandSes
 
 const wchar_t *LoadErrorText(int error) {
   switch (error) {
-  case kDevhostNoSuchModule: return L"the file is missing or is not a loadable module";
-  case kDevhostNoEntryPoint: return L"it exports no acrxEntryPoint/acrxGetApiVersion";
-  case kDevhostWrongApiVersion: return L"it was built for another ObjectARX release";
-  default: return L"unknown failure";
+    case kDevhostNoSuchModule: return L"the file is missing or is not a loadable module";
+    case kDevhostNoEntryPoint: return L"it exports no acrxEntryPoint/acrxGetApiVersion";
+    case kDevhostWrongApiVersion: return L"it was built for another ObjectARX release";
+    default: return L"unknown failure";
   }
 }
 
@@ -98,12 +98,13 @@ int main() {
     if (!options.batch) window.AppendHistory(text);
   });
   devhostSetOutputSink(ForwardPrinted, &session);
-  const bool hasWindow = window.Create(GetModuleHandleW(nullptr),
-                                       [&session](const std::wstring &line) {
-                                         session.Write(L"Command: " + line + L"\n");
-                                         session.Evaluate(line);
-                                       },
-                                       [] { devhostUnloadModule(); });
+  const bool hasWindow = window.Create(
+      GetModuleHandleW(nullptr),
+      [&session](const std::wstring &line) {
+        session.Write(L"Command: " + line + L"\n");
+        session.Evaluate(line);
+      },
+      [] { devhostUnloadModule(); });
   if (hasWindow) devhostSetWindows(window.Frame(), window.DrawingView());
 
   for (int i = 0; i < options.drawings; ++i) devhostOpenDrawing();

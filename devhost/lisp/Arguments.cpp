@@ -7,16 +7,16 @@
 
 namespace lisp {
 
-void RequireCount(const std::vector<Value>& args, size_t least, size_t most) {
+void RequireCount(const std::vector<Value> &args, size_t least, size_t most) {
   if (args.size() < least) throw Error("too few arguments");
   if (args.size() > most) throw Error("too many arguments");
 }
 
-void BadArgument(const char* predicate, const Value& value) {
+void BadArgument(const char *predicate, const Value &value) {
   throw Error(std::string("bad argument type: ") + predicate + " " + ToUtf8(Prin1(value)));
 }
 
-const std::vector<Value>& ListItems(const Value& value, const char* predicate) {
+const std::vector<Value> &ListItems(const Value &value, const char *predicate) {
   static const std::vector<Value> empty;
   if (value.IsNil()) return empty;
   if (!value.IsList()) BadArgument(predicate, value);

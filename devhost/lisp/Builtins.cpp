@@ -13,14 +13,14 @@ using Table = std::unordered_map<std::wstring, Builtin>;
 
 Table MakeTable() {
   Table table;
-  for (const auto* group : {&ListBuiltins(), &NumberBuiltins(), &TextBuiltins()}) {
-    for (const BuiltinEntry& entry : *group) table.emplace(entry.name, entry.function);
+  for (const auto *group : {&ListBuiltins(), &NumberBuiltins(), &TextBuiltins()}) {
+    for (const BuiltinEntry &entry : *group) table.emplace(entry.name, entry.function);
   }
   return table;
 }
 
 // CAR and CDR compose up to four deep: CADR, CDDR, CADDR, ..., CDDDDR.
-bool IsCarCdrChain(const std::wstring& name) {
+bool IsCarCdrChain(const std::wstring &name) {
   if (name.size() < 3 || name.size() > 6) return false;
   if (name.front() != L'C' || name.back() != L'R') return false;
   for (size_t i = 1; i + 1 < name.size(); ++i) {
@@ -29,7 +29,7 @@ bool IsCarCdrChain(const std::wstring& name) {
   return true;
 }
 
-Value CarCdrChain(const BuiltinCall& call) {
+Value CarCdrChain(const BuiltinCall &call) {
   RequireCount(call.args, 1, 1);
   Value value = call.args[0];
   // The letters apply from the innermost (rightmost) outwards; nil stays nil.
@@ -48,7 +48,7 @@ Value CarCdrChain(const BuiltinCall& call) {
 
 }  // namespace
 
-Builtin FindBuiltin(const std::wstring& name) {
+Builtin FindBuiltin(const std::wstring &name) {
   static const Table table = MakeTable();
   const auto found = table.find(name);
   if (found != table.end()) return found->second;

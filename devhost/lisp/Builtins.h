@@ -10,24 +10,24 @@
 namespace lisp {
 
 struct BuiltinCall {
-  const std::wstring& name;  // upper-cased, for functions that serve a family of names
-  std::vector<Value>& args;  // the evaluated arguments, which the function may take over
-  const Evaluator::Output& output;
+  const std::wstring &name;  // upper-cased, for functions that serve a family of names
+  std::vector<Value> &args;  // the evaluated arguments, which the function may take over
+  const Evaluator::Output &output;
 };
 
-using Builtin = Value (*)(const BuiltinCall& call);
+using Builtin = Value (*)(const BuiltinCall &call);
 
 struct BuiltinEntry {
-  const wchar_t* name;
+  const wchar_t *name;
   Builtin function;
 };
 
 // The groups, one file each.
-const std::vector<BuiltinEntry>& ListBuiltins();
-const std::vector<BuiltinEntry>& NumberBuiltins();
-const std::vector<BuiltinEntry>& TextBuiltins();
+const std::vector<BuiltinEntry> &ListBuiltins();
+const std::vector<BuiltinEntry> &NumberBuiltins();
+const std::vector<BuiltinEntry> &TextBuiltins();
 
 // The built-in function of that upper-cased name, or null.
-Builtin FindBuiltin(const std::wstring& name);
+Builtin FindBuiltin(const std::wstring &name);
 
 }  // namespace lisp

@@ -19,12 +19,11 @@ Value Received(Value value) {
 
 }  // namespace
 
-Evaluator::Evaluator(External external, Output output)
-    : m_external(std::move(external)), m_output(std::move(output)) {}
+Evaluator::Evaluator(External external, Output output) : m_external(std::move(external)), m_output(std::move(output)) {}
 
-Value Evaluator::Eval(const Value& form) { return EvalAt(form, 0); }
+Value Evaluator::Eval(const Value &form) { return EvalAt(form, 0); }
 
-Value Evaluator::EvalAt(const Value& form, int depth) {
+Value Evaluator::EvalAt(const Value &form, int depth) {
   switch (form.kind) {
     case Value::Kind::Sym: {
       const auto found = m_variables.find(form.text);
@@ -35,11 +34,11 @@ Value Evaluator::EvalAt(const Value& form, int depth) {
   }
 }
 
-Value Evaluator::EvalCall(const Value& form, int depth) {
+Value Evaluator::EvalCall(const Value &form, int depth) {
   if (depth > kMaxEvalDepth) throw Error("stack limit reached");
-  const Value& head = form.items.front();
+  const Value &head = form.items.front();
   if (head.kind != Value::Kind::Sym) throw Error("bad function: " + ToUtf8(Prin1(head)));
-  const std::wstring& name = head.text;
+  const std::wstring &name = head.text;
   if (name == L"QUOTE") {
     if (form.items.size() < 2) throw Error("too few arguments");
     if (form.items.size() > 2) throw Error("too many arguments");
@@ -57,11 +56,11 @@ Value Evaluator::EvalCall(const Value& form, int depth) {
 }
 
 // (setq name value ...): each value is evaluated and bound before the next pair.
-Value Evaluator::Setq(const std::vector<Value>& items, int depth) {
+Value Evaluator::Setq(const std::vector<Value> &items, int depth) {
   if (items.size() % 2 == 0) throw Error("too few arguments");
   Value result;
   for (size_t i = 1; i < items.size(); i += 2) {
-    const Value& target = items[i];
+    const Value &target = items[i];
     if (target.kind != Value::Kind::Sym) BadArgument("symbolp", target);
     result = Received(EvalAt(items[i + 1], depth));
     if (result.IsNil()) {
@@ -73,7 +72,7 @@ Value Evaluator::Setq(const std::vector<Value>& items, int depth) {
   return result;
 }
 
-Value Evaluator::CallExternal(const std::wstring& name, const std::vector<Value>& args) {
+Value Evaluator::CallExternal(const std::wstring &name, const std::vector<Value> &args) {
   std::optional<Value> result;
   if (m_external) result = m_external(name, args);
   if (!result) throw Error("no function definition: " + ToUtf8(name));

@@ -22,7 +22,7 @@ struct NumberParts {
   long exponent = 0;  // saturated well beyond any double's range
 };
 
-std::optional<NumberParts> Split(const std::wstring& token) {
+std::optional<NumberParts> Split(const std::wstring &token) {
   NumberParts parts;
   size_t i = 0;
   if (i < token.size() && (token[i] == L'+' || token[i] == L'-')) {
@@ -60,7 +60,7 @@ std::optional<NumberParts> Split(const std::wstring& token) {
   return parts;
 }
 
-std::optional<int32_t> ToInteger(const std::wstring& token, const NumberParts& parts) {
+std::optional<int32_t> ToInteger(const std::wstring &token, const NumberParts &parts) {
   const int64_t limit = parts.negative ? int64_t{1} << 31 : (int64_t{1} << 31) - 1;
   int64_t magnitude = 0;
   for (size_t i = parts.intBegin; i < parts.intEnd; ++i) {
@@ -72,7 +72,7 @@ std::optional<int32_t> ToInteger(const std::wstring& token, const NumberParts& p
 
 // Infinity or zero for a real beyond the range of double, by the power of ten of its first
 // significant digit.
-double OutOfRange(const std::wstring& token, const NumberParts& parts) {
+double OutOfRange(const std::wstring &token, const NumberParts &parts) {
   long leading = 0;
   bool found = false;
   for (size_t i = parts.intBegin; i < parts.intEnd && !found; ++i) {
@@ -87,12 +87,11 @@ double OutOfRange(const std::wstring& token, const NumberParts& parts) {
       found = true;
     }
   }
-  const double magnitude =
-      found && leading + parts.exponent > 0 ? std::numeric_limits<double>::infinity() : 0.0;
+  const double magnitude = found && leading + parts.exponent > 0 ? std::numeric_limits<double>::infinity() : 0.0;
   return parts.negative ? -magnitude : magnitude;
 }
 
-double ToReal(const std::wstring& token, const NumberParts& parts) {
+double ToReal(const std::wstring &token, const NumberParts &parts) {
   // The token is plain ASCII here; from_chars reads it the same in every locale.
   std::string narrow;
   narrow.reserve(token.size());
@@ -101,15 +100,14 @@ double ToReal(const std::wstring& token, const NumberParts& parts) {
     narrow += static_cast<char>(token[i]);
   }
   double value = 0;
-  const auto result = std::from_chars(narrow.data(), narrow.data() + narrow.size(), value,
-                                      std::chars_format::general);
+  const auto result = std::from_chars(narrow.data(), narrow.data() + narrow.size(), value, std::chars_format::general);
   if (result.ec == std::errc::result_out_of_range) return OutOfRange(token, parts);
   return value;
 }
 
 }  // namespace
 
-std::optional<Value> ParseNumber(const std::wstring& token) {
+std::optional<Value> ParseNumber(const std::wstring &token) {
   const auto parts = Split(token);
   if (!parts) return std::nullopt;
   if (!parts->hasPoint && !parts->hasExponent) {

@@ -8,7 +8,7 @@ namespace lisp {
 
 namespace {
 
-void AppendOctal(std::wstring& out, wchar_t c) {
+void AppendOctal(std::wstring &out, wchar_t c) {
   const unsigned code = static_cast<unsigned>(c);
   out += L'\\';
   out += static_cast<wchar_t>(L'0' + ((code >> 6) & 7));
@@ -16,7 +16,7 @@ void AppendOctal(std::wstring& out, wchar_t c) {
   out += static_cast<wchar_t>(L'0' + (code & 7));
 }
 
-void AppendQuoted(std::wstring& out, const std::wstring& text) {
+void AppendQuoted(std::wstring &out, const std::wstring &text) {
   out += L'"';
   for (const wchar_t c : text) {
     switch (c) {
@@ -37,7 +37,7 @@ void AppendQuoted(std::wstring& out, const std::wstring& text) {
   out += L'"';
 }
 
-void Append(std::wstring& out, const Value& value, bool quoteStrings) {
+void Append(std::wstring &out, const Value &value, bool quoteStrings) {
   switch (value.kind) {
     case Value::Kind::Nil: out += L"nil"; break;
     case Value::Kind::T: out += L"T"; break;
@@ -65,13 +65,13 @@ void Append(std::wstring& out, const Value& value, bool quoteStrings) {
 
 }  // namespace
 
-std::wstring Prin1(const Value& value) {
+std::wstring Prin1(const Value &value) {
   std::wstring out;
   Append(out, value, true);
   return out;
 }
 
-std::wstring Princ(const Value& value) {
+std::wstring Princ(const Value &value) {
   std::wstring out;
   Append(out, value, false);
   return out;
@@ -81,8 +81,7 @@ std::wstring FormatReal(double value) {
   if (std::isnan(value)) return std::signbit(value) ? L"-1.#IND" : L"1.#QNAN";
   if (std::isinf(value)) return value > 0 ? L"1.#INF" : L"-1.#INF";
   char buffer[64];
-  const auto result =
-      std::to_chars(buffer, buffer + sizeof buffer, value, std::chars_format::general, 6);
+  const auto result = std::to_chars(buffer, buffer + sizeof buffer, value, std::chars_format::general, 6);
   const std::string digits(buffer, result.ptr);
   const size_t e = digits.find('e');
   std::string mantissa = digits.substr(0, e);

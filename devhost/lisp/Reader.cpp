@@ -15,9 +15,7 @@ const char kMisplacedDot[] = "misplaced dot on input";
 
 bool IsBlank(wchar_t c) { return c <= L' '; }
 
-bool EndsToken(wchar_t c) {
-  return IsBlank(c) || c == L'(' || c == L')' || c == L'\'' || c == L'"' || c == L';';
-}
+bool EndsToken(wchar_t c) { return IsBlank(c) || c == L'(' || c == L')' || c == L'\'' || c == L'"' || c == L';'; }
 
 bool IsOctal(wchar_t c) { return c >= L'0' && c <= L'7'; }
 
@@ -33,8 +31,8 @@ struct OpenList {
 
 // Reads without recursion, so that the depth limit, not the machine stack, bounds nesting.
 class Reader {
-public:
-  explicit Reader(const std::wstring& source) : m_source(source) {}
+ public:
+  explicit Reader(const std::wstring &source) : m_source(source) {}
 
   std::vector<Value> ReadAll() {
     for (;;) {
@@ -65,7 +63,7 @@ public:
     return std::move(m_forms);
   }
 
-private:
+ private:
   bool AtEnd() const { return m_pos >= m_source.size(); }
 
   void Deeper() {
@@ -123,7 +121,7 @@ private:
       m_forms.push_back(std::move(value));
       return;
     }
-    OpenList& list = m_open.back();
+    OpenList &list = m_open.back();
     if (!list.dotSeen) {
       list.items.push_back(std::move(value));
       return;
@@ -137,7 +135,7 @@ private:
   // representation here.
   static Value Close(OpenList list) {
     if (list.tail.IsList()) {
-      for (Value& item : list.tail.items) list.items.push_back(std::move(item));
+      for (Value &item : list.tail.items) list.items.push_back(std::move(item));
     } else if (!list.tail.IsNil()) {
       throw Error("dotted pairs are not supported on input");
     }
@@ -200,12 +198,12 @@ private:
 
   void ReadDot() {
     if (m_open.empty() || m_quotes > 0) throw Error(kMisplacedDot);
-    OpenList& list = m_open.back();
+    OpenList &list = m_open.back();
     if (list.items.empty() || list.dotSeen) throw Error(kMisplacedDot);
     list.dotSeen = true;
   }
 
-  const std::wstring& m_source;
+  const std::wstring &m_source;
   size_t m_pos = 0;
   std::vector<OpenList> m_open;
   int m_quotes = 0;  // quotes read since the last datum, waiting for the next one
@@ -215,6 +213,6 @@ private:
 
 }  // namespace
 
-std::vector<Value> ReadAll(const std::wstring& source) { return Reader(source).ReadAll(); }
+std::vector<Value> ReadAll(const std::wstring &source) { return Reader(source).ReadAll(); }
 
 }  // namespace lisp

@@ -13,6 +13,6 @@ namespace lisp {
 constexpr int kMaxReadDepth = 1000;
 
 // Every top-level form in order. Throws Error on malformed input.
-std::vector<Value> ReadAll(const std::wstring& source);
+std::vector<Value> ReadAll(const std::wstring &source);
 
 }  // namespace lisp

@@ -6,7 +6,7 @@ namespace lisp {
 
 namespace {
 
-void AppendWide(std::wstring& out, uint32_t codePoint) {
+void AppendWide(std::wstring &out, uint32_t codePoint) {
   if (sizeof(wchar_t) == 2 && codePoint >= 0x10000) {
     codePoint -= 0x10000;
     out += static_cast<wchar_t>(0xD800 + (codePoint >> 10));
@@ -18,7 +18,7 @@ void AppendWide(std::wstring& out, uint32_t codePoint) {
 
 }  // namespace
 
-std::string ToUtf8(const std::wstring& text) {
+std::string ToUtf8(const std::wstring &text) {
   std::string out;
   out.reserve(text.size());
   for (size_t i = 0; i < text.size(); ++i) {
@@ -51,7 +51,7 @@ std::string ToUtf8(const std::wstring& text) {
   return out;
 }
 
-std::wstring FromUtf8(const std::string& text) {
+std::wstring FromUtf8(const std::string &text) {
   std::wstring out;
   out.reserve(text.size());
   size_t i = 0;

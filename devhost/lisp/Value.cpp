@@ -56,7 +56,7 @@ Value Value::Void() {
   return v;
 }
 
-bool operator==(const Value& a, const Value& b) {
+bool operator==(const Value &a, const Value &b) {
   if (a.kind != b.kind) return false;
   switch (a.kind) {
     case Value::Kind::Int: return a.integer == b.integer;
@@ -68,12 +68,12 @@ bool operator==(const Value& a, const Value& b) {
   }
 }
 
-Error::Error(const std::string& message) : std::runtime_error(message) {}
+Error::Error(const std::string &message) : std::runtime_error(message) {}
 
-std::wstring WideMessage(const Error& error) { return FromUtf8(error.what()); }
+std::wstring WideMessage(const Error &error) { return FromUtf8(error.what()); }
 
 std::wstring UpperName(std::wstring name) {
-  for (wchar_t& c : name) {
+  for (wchar_t &c : name) {
     const bool asciiLower = c >= L'a' && c <= L'z';
     const bool latinLower = c >= 0xE0 && c <= 0xFE && c != 0xF7;
     if (asciiLower || latinLower) c = static_cast<wchar_t>(c - 0x20);

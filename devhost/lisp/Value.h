@@ -32,16 +32,16 @@ struct Value {
 };
 
 // Structural equality: same kind and same contents; reals compare by value.
-bool operator==(const Value& a, const Value& b);
-inline bool operator!=(const Value& a, const Value& b) { return !(a == b); }
+bool operator==(const Value &a, const Value &b);
+inline bool operator!=(const Value &a, const Value &b) { return !(a == b); }
 
 // An AutoLISP error; the message is the text after "; error: ", in UTF-8.
 struct Error : std::runtime_error {
-  explicit Error(const std::string& message);
+  explicit Error(const std::string &message);
 };
 
 // The error's message as wide text, for a command line that prints wide text.
-std::wstring WideMessage(const Error& error);
+std::wstring WideMessage(const Error &error);
 
 // Upper-cases a symbol name as the reader does: ASCII and Latin-1 letters only, so that the
 // result does not depend on the process locale.

@@ -11,11 +11,11 @@
 #include <vector>
 
 class AcApDocument {
-public:
+ public:
   explicit AcApDocument(int serial) : m_serial(serial) {}
   int serial() const { return m_serial; }
 
-private:
+ private:
   int m_serial;
 };
 

@@ -3,7 +3,7 @@
 
 namespace {
 class HostApplication final : public CWinAppHost {
-public:
+ public:
   void *mainWindow() const override { return devhost::State().mainFrame; }
 };
 }  // namespace

@@ -39,9 +39,12 @@ int acedDefun(const ACHAR *name, int funcNumber) {
   devhost::Drawing *drawing = devhost::CurrentDrawing();
   if (!drawing || !name || !*name) return RTERROR;
   auto &functions = drawing->functions;
-  auto found = std::find_if(functions.begin(), functions.end(), [&](const devhost::DefinedFunction &f) { return SameName(f.name, name); });
-  if (found != functions.end()) found->code = funcNumber;
-  else functions.push_back({name, funcNumber});
+  auto found =
+      std::find_if(functions.begin(), functions.end(), [&](const devhost::DefinedFunction &f) { return SameName(f.name, name); });
+  if (found != functions.end())
+    found->code = funcNumber;
+  else
+    functions.push_back({name, funcNumber});
   return RTNORM;
 }
 
@@ -80,7 +83,8 @@ bool devhostIsDefined(int drawing, const wchar_t *name) {
   auto &drawings = State().drawings;
   if (drawing < 0 || drawing >= static_cast<int>(drawings.size()) || !name) return false;
   const auto &functions = drawings[drawing].functions;
-  return std::any_of(functions.begin(), functions.end(), [&](const devhost::DefinedFunction &f) { return SameName(f.name, name); });
+  return std::any_of(functions.begin(), functions.end(),
+                     [&](const devhost::DefinedFunction &f) { return SameName(f.name, name); });
 }
 
 bool devhostInvoke(const wchar_t *name, resbuf *args) {

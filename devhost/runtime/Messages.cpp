@@ -26,8 +26,10 @@ std::wstring Format(const ACHAR *format, va_list args) {
 std::string Escaped(const std::wstring &text) {
   std::string line;
   for (wchar_t c : text) {
-    if (c == L'\n') line += "\\n";
-    else if (c < 0x80) line += static_cast<char>(c);
+    if (c == L'\n')
+      line += "\\n";
+    else if (c < 0x80)
+      line += static_cast<char>(c);
     else {
       char bytes[8];
       const int n = WideCharToMultiByte(CP_ACP, 0, &c, 1, bytes, sizeof bytes, nullptr, nullptr);

@@ -80,7 +80,8 @@ void devhostCloseDrawing(int index) {
   state.current = index;
   Send(kUnloadDwgMsg);
   AcApDocument *document = state.drawings[index].document.get();
-  for (AcApDocManagerReactor *reactor : std::vector<AcApDocManagerReactor *>(state.reactors)) reactor->documentToBeDestroyed(document);
+  for (AcApDocManagerReactor *reactor : std::vector<AcApDocManagerReactor *>(state.reactors))
+    reactor->documentToBeDestroyed(document);
   state.drawings.erase(state.drawings.begin() + index);
   state.current = state.drawings.empty() ? -1 : 0;
 }

@@ -8,12 +8,12 @@ namespace {
 using devhost::State;
 
 class DynamicLinker final : public AcRxDynamicLinker {
-public:
+ public:
   const ACHAR *className() const override { return kClassName; }
   bool unlockApplication(void *appId) const override { return Mark(appId, State().unlocked); }
   bool registerAppMDIAware(void *appId) const override { return Mark(appId, State().mdiAware); }
 
-private:
+ private:
   static bool Mark(void *appId, bool &flag) {
     if (!appId || appId != State().module) return false;
     flag = true;
@@ -22,7 +22,7 @@ private:
 };
 
 class SystemRegistry final : public AcRxDictionary {
-public:
+ public:
   const ACHAR *className() const override { return L"AcRxDictionary"; }
   AcRxObject *at(const ACHAR *key) const override {
     static DynamicLinker linker;
@@ -31,7 +31,7 @@ public:
 };
 
 class DocManager final : public AcApDocManager {
-public:
+ public:
   void addReactor(AcApDocManagerReactor *reactor) override {
     auto &reactors = State().reactors;
     if (reactor && std::find(reactors.begin(), reactors.end(), reactor) == reactors.end()) reactors.push_back(reactor);

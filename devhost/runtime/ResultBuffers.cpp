@@ -84,37 +84,37 @@ resbuf *acutBuildList(int type, ...) {
     (tail ? tail->rbnext : head) = node;
     tail = node;
     switch (type) {
-    case RTSHORT: node->resval.rint = static_cast<short>(va_arg(args, int)); break;
-    case RTLONG: node->resval.rlong = va_arg(args, int32_t); break;
-    case RTREAL:
-    case RTANG:
-    case RTORINT: node->resval.rreal = va_arg(args, double); break;
-    case RTSTR: {
-      const ACHAR *text = va_arg(args, const ACHAR *);
-      node->resval.rstring = acad__strdup(text ? text : L"");
-      failed = node->resval.rstring == nullptr;
-      break;
-    }
-    case RTPOINT:
-    case RT3DPOINT: {
-      const double *point = va_arg(args, const double *);
-      for (int i = 0; i < 3; ++i) node->resval.rpoint[i] = point ? point[i] : 0.0;
-      break;
-    }
-    case RTENAME:
-    case RTPICKS: {
-      const int64_t *name = va_arg(args, const int64_t *);
-      for (int i = 0; i < 2; ++i) node->resval.rlname[i] = name ? name[i] : 0;
-      break;
-    }
-    case RTLB:
-    case RTLE:
-    case RTDOTE:
-    case RTNIL:
-    case RTT:
-    case RTVOID:
-    case RTNONE: break;
-    default: failed = true; break;  // a type this host does not know: the rest cannot be read
+      case RTSHORT: node->resval.rint = static_cast<short>(va_arg(args, int)); break;
+      case RTLONG: node->resval.rlong = va_arg(args, int32_t); break;
+      case RTREAL:
+      case RTANG:
+      case RTORINT: node->resval.rreal = va_arg(args, double); break;
+      case RTSTR: {
+        const ACHAR *text = va_arg(args, const ACHAR *);
+        node->resval.rstring = acad__strdup(text ? text : L"");
+        failed = node->resval.rstring == nullptr;
+        break;
+      }
+      case RTPOINT:
+      case RT3DPOINT: {
+        const double *point = va_arg(args, const double *);
+        for (int i = 0; i < 3; ++i) node->resval.rpoint[i] = point ? point[i] : 0.0;
+        break;
+      }
+      case RTENAME:
+      case RTPICKS: {
+        const int64_t *name = va_arg(args, const int64_t *);
+        for (int i = 0; i < 2; ++i) node->resval.rlname[i] = name ? name[i] : 0;
+        break;
+      }
+      case RTLB:
+      case RTLE:
+      case RTDOTE:
+      case RTNIL:
+      case RTT:
+      case RTVOID:
+      case RTNONE: break;
+      default: failed = true; break;  // a type this host does not know: the rest cannot be read
     }
   }
   va_end(args);

@@ -6,4 +6,4 @@
 namespace devhost {
 // Releases a chain without recording it: for the host's own copies, not the module's doing.
 int ReleaseNodes(resbuf *chain);
-}
+}  // namespace devhost

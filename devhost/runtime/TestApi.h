@@ -26,10 +26,10 @@ enum DevhostLoadError : int {
   kDevhostAlreadyLoaded = 4,
 };
 DEVHOST_API int devhostLoadModule(const wchar_t *path);  // LoadLibrary, then entry code 1
-DEVHOST_API void devhostUnloadModule();                   // code 4 per open drawing, code 2, FreeLibrary
-DEVHOST_API int devhostSendEntryMessage(int code);        // the module's answer
-DEVHOST_API int devhostOpenDrawing();                     // a new current drawing, code 3; its index
-DEVHOST_API void devhostCloseDrawing(int index);          // code 4 in that drawing, then it is destroyed
+DEVHOST_API void devhostUnloadModule();                  // code 4 per open drawing, code 2, FreeLibrary
+DEVHOST_API int devhostSendEntryMessage(int code);       // the module's answer
+DEVHOST_API int devhostOpenDrawing();                    // a new current drawing, code 3; its index
+DEVHOST_API void devhostCloseDrawing(int index);         // code 4 in that drawing, then it is destroyed
 DEVHOST_API int devhostDrawingCount();
 DEVHOST_API void devhostActivateDrawing(int index);
 DEVHOST_API bool devhostIsDefined(int drawing, const wchar_t *name);

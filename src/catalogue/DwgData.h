@@ -7,7 +7,7 @@
 #include <string>
 
 class DwgData {
-public:
+ public:
   DwgData() = default;
   DwgData(std::string lowerName, int64_t lastWrite, uint32_t fileSize)
       : m_strDwgName(std::move(lowerName)), m_tLastWrite(lastWrite), m_nFileSize(fileSize) {}

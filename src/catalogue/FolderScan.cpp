@@ -13,7 +13,7 @@ namespace {
 const int kCatalogueGrowBy = 100;
 
 class FindListing {
-public:
+ public:
   explicit FindListing(intptr_t handle) : m_handle(handle) {}
   ~FindListing() {
     if (IsOpen()) _findclose(m_handle);
@@ -24,7 +24,7 @@ public:
   bool IsOpen() const { return m_handle != -1; }
   intptr_t Handle() const { return m_handle; }
 
-private:
+ private:
   intptr_t m_handle;
 };
 }  // namespace

@@ -14,14 +14,14 @@
 #include <vector>
 
 class ListingCollector {
-public:
+ public:
   void Add(const char *lowerName, int64_t lastWrite, uint32_t fileSize);
 
   // Replaces the catalogue's content with the gathered records, in the order they were added,
   // every one unmarked, and leaves the catalogue's growth step at `growBy`.
   void MoveInto(DwgCatalogue &catalogue, int growBy) const;
 
-private:
+ private:
   struct Entry {
     std::size_t nameOffset;
     std::size_t nameLength;

@@ -9,7 +9,7 @@
 #include <string>
 
 class COmbra3Doc : public fw::CDocument {
-public:
+ public:
   // Reads the state file; sets g_pDoc.
   COmbra3Doc();
   // Writes every value back to the state file; clears g_pDoc.
@@ -26,7 +26,7 @@ public:
   int m_nSort = 0;
   CIniFile m_iniFile;
 
-private:
+ private:
   void LoadState();
   void SaveState();
 };

@@ -4,6 +4,6 @@
 #include "fw/Dialog.h"
 
 class CAboutDlgArx : public fw::CDialog {
-public:
+ public:
   explicit CAboutDlgArx(fw::CWnd *parent = nullptr);
 };

@@ -5,7 +5,7 @@
 #include "fw/Dialog.h"
 
 class CDialogRun : public fw::CDialog {
-public:
+ public:
   CDialogRun();
   ~CDialogRun() override;
 

@@ -4,7 +4,7 @@
 #include "fw/View.h"
 
 class CLeftView : public fw::CView {
-public:
+ public:
   CLeftView();
   ~CLeftView() override;
 

@@ -23,14 +23,14 @@ constexpr int kInitialPaneHeight = 100;
 constexpr UINT kIndicators[] = {ID_SEPARATOR, ID_INDICATOR_CAPS, ID_INDICATOR_NUM, ID_INDICATOR_SCRL};
 
 class ClientDC {
-public:
+ public:
   explicit ClientDC(HWND hwnd) : m_hwnd(hwnd), m_dc(GetDC(hwnd)) {}
   ~ClientDC() { ReleaseDC(m_hwnd, m_dc); }
   ClientDC(const ClientDC &) = delete;
   ClientDC &operator=(const ClientDC &) = delete;
   HDC get() const { return m_dc; }
 
-private:
+ private:
   HWND m_hwnd;
   HDC m_dc;
 };
@@ -209,41 +209,41 @@ BOOL CMainFrame::OnFrameCommand(UINT id, int code, fw::CCmdUI *cmdUI) {
   const bool update = code == fw::CN_UPDATE_COMMAND_UI;
   if (!update && code != fw::CN_COMMAND) return CFrameWnd::OnFrameCommand(id, code, cmdUI);
   switch (id) {
-  case ID_SORT_BY_NAME: return OnSortCommand(0, update, cmdUI);
-  case ID_SORT_BY_DATE: return OnSortCommand(1, update, cmdUI);
-  case ID_SORT_BY_SIZE: return OnSortCommand(2, update, cmdUI);
-  default: break;
+    case ID_SORT_BY_NAME: return OnSortCommand(0, update, cmdUI);
+    case ID_SORT_BY_DATE: return OnSortCommand(1, update, cmdUI);
+    case ID_SORT_BY_SIZE: return OnSortCommand(2, update, cmdUI);
+    default: break;
   }
   if (update) return CFrameWnd::OnFrameCommand(id, code, cmdUI);
   switch (id) {
-  case ID_VIEW_BEGIN:
-  case ID_VIEW_INCREASE:
-  case ID_VIEW_DECREASE:
-  case ID_VIEW_ALIGNE:
-  case ID_FILE_OPEN:
-    if (g_pThumbView) g_pThumbView->SendMessage(WM_COMMAND, id);
-    return TRUE;
-  case ID_EDIT_COPY:
-    if (g_pThumbView) g_pThumbView->CopySelected();
-    return TRUE;
-  case ID_EDIT_PASTE:
-    if (g_pThumbView && g_pThumbView->PasteFiles() && g_pLeftView) g_pLeftView->RefreshSelectedFolder();
-    return TRUE;
-  case ID_EDIT_CUT: return TRUE;
-  case ID_MARK_ALL:
-    if (g_pThumbView) g_pThumbView->SelectAll();
-    return TRUE;
-  case ID_CLEAR_FOCUSED_EDIT:
-    if (g_pFocusedEdit) g_pFocusedEdit->SendMessage(WM_CLEAR);
-    return TRUE;
-  case ID_BROWSE_ACCEPT: EndBrowse(1); return TRUE;
-  case ID_BROWSE_CANCEL: EndBrowse(2); return TRUE;
-  case ID_APP_ABOUT: {
-    CAboutDlgArx about(this);
-    about.DoModal();
-    return TRUE;
-  }
-  case ID_HELP: OpenHelp(); return TRUE;
-  default: return CFrameWnd::OnFrameCommand(id, code, cmdUI);
+    case ID_VIEW_BEGIN:
+    case ID_VIEW_INCREASE:
+    case ID_VIEW_DECREASE:
+    case ID_VIEW_ALIGNE:
+    case ID_FILE_OPEN:
+      if (g_pThumbView) g_pThumbView->SendMessage(WM_COMMAND, id);
+      return TRUE;
+    case ID_EDIT_COPY:
+      if (g_pThumbView) g_pThumbView->CopySelected();
+      return TRUE;
+    case ID_EDIT_PASTE:
+      if (g_pThumbView && g_pThumbView->PasteFiles() && g_pLeftView) g_pLeftView->RefreshSelectedFolder();
+      return TRUE;
+    case ID_EDIT_CUT: return TRUE;
+    case ID_MARK_ALL:
+      if (g_pThumbView) g_pThumbView->SelectAll();
+      return TRUE;
+    case ID_CLEAR_FOCUSED_EDIT:
+      if (g_pFocusedEdit) g_pFocusedEdit->SendMessage(WM_CLEAR);
+      return TRUE;
+    case ID_BROWSE_ACCEPT: EndBrowse(1); return TRUE;
+    case ID_BROWSE_CANCEL: EndBrowse(2); return TRUE;
+    case ID_APP_ABOUT: {
+      CAboutDlgArx about(this);
+      about.DoModal();
+      return TRUE;
+    }
+    case ID_HELP: OpenHelp(); return TRUE;
+    default: return CFrameWnd::OnFrameCommand(id, code, cmdUI);
   }
 }

@@ -12,7 +12,7 @@
 #include <string>
 
 class CMainFrame : public fw::CFrameWnd {
-public:
+ public:
   CMainFrame();
   ~CMainFrame() override;
 
@@ -32,13 +32,13 @@ public:
   fw::CToolBar m_wndToolBar;
   fw::CToolBar m_wndToolBarBottom;
 
-protected:
+ protected:
   int OnCreate(CREATESTRUCTA *cs) override;
   BOOL OnCreateClient(CREATESTRUCTA *cs) override;
   void OnDestroy() override;
   BOOL OnFrameCommand(UINT id, int code, fw::CCmdUI *cmdUI) override;
 
-private:
+ private:
   bool CreateTopBar();
   bool CreateBottomBar();
   bool CreateLabel(fw::CStatic &label, fw::CToolBar &bar, UINT slotId, const std::string &text, int extraWidth);

@@ -8,7 +8,6 @@
 #include "host/HostApi.h"
 #include "host/ShellPathCompose.h"
 
-
 bool CMdiMixin::SetFrameResource(UINT resourceId) {
   m_nFrameResource = resourceId;
   return true;

@@ -11,7 +11,7 @@ class CDialog;
 }
 
 class CMdiMixin : public fw::CWinApp {
-public:
+ public:
   virtual bool SetFrameResource(UINT resourceId);
   // Creates the document and the frame owned by the dialog, disables the host's main window
   // and shows the frame where it was last; false when the frame could not be made.
@@ -23,6 +23,6 @@ public:
   std::string GetFullPath() const;
   void DeleteDocument();
 
-private:
+ private:
   UINT m_nFrameResource = static_cast<UINT>(-1);
 };

@@ -4,8 +4,7 @@ namespace {
 std::string ExtensionOf(const std::string &path) {
   const size_t driveEnd = path.size() >= 2 && path[1] == ':' ? 2 : 0;
   const size_t lastSeparator = path.find_last_of("\\/");
-  const size_t nameStart =
-      lastSeparator == std::string::npos || lastSeparator < driveEnd ? driveEnd : lastSeparator + 1;
+  const size_t nameStart = lastSeparator == std::string::npos || lastSeparator < driveEnd ? driveEnd : lastSeparator + 1;
   const size_t dot = path.rfind('.');
   return dot == std::string::npos || dot < nameStart ? std::string() : path.substr(dot);
 }

@@ -18,7 +18,7 @@ std::string EncodeFileList(const std::vector<std::string> &paths);
 // into the header or past the end, has no paths; a list without its final NUL ends at the
 // block's end.
 class FileListReader {
-public:
+ public:
   FileListReader(const void *block, size_t size);
 
   bool IsWide() const { return m_bWide; }
@@ -27,7 +27,7 @@ public:
   // The next path of a wide list, as UTF-16 code units; false at the end (always for narrow).
   bool NextWide(std::u16string &path);
 
-private:
+ private:
   const unsigned char *m_pBlock;
   size_t m_nSize;
   size_t m_nPos;

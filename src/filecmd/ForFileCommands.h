@@ -5,7 +5,7 @@
 #include <windows.h>
 
 class ForFileCommands {
-public:
+ public:
   virtual ~ForFileCommands() = default;
 
   // True when the clipboard offers a file list holding at least one drawing.

@@ -9,8 +9,7 @@
 
 CShellFileOp::CShellFileOp() { std::memset(&m_op, 0, sizeof m_op); }
 
-CShellFileOp::CShellFileOp(HWND owner, int kind, const char *from, const char *to, FILEOP_FLAGS flags,
-                           const char *title)
+CShellFileOp::CShellFileOp(HWND owner, int kind, const char *from, const char *to, FILEOP_FLAGS flags, const char *title)
     : CShellFileOp() {
   if (from) AddFile(0, from);
   if (to) AddFile(1, to);
@@ -18,11 +17,11 @@ CShellFileOp::CShellFileOp(HWND owner, int kind, const char *from, const char *t
   SetFlags(flags);
   SetTitle(title);
   switch (kind) {
-  case 1: Run(FO_MOVE); break;
-  case 2: Run(FO_COPY); break;
-  case 3: DeleteFiles(); break;
-  case 4: Run(FO_RENAME); break;
-  default: break;
+    case 1: Run(FO_MOVE); break;
+    case 2: Run(FO_COPY); break;
+    case 3: DeleteFiles(); break;
+    case 4: Run(FO_RENAME); break;
+    default: break;
   }
 }
 
@@ -33,9 +32,8 @@ CShellFileOp::~CShellFileOp() {
 }
 
 bool CShellFileOp::AddFile(int which, const char *path) {
-  const bool added = which == 0
-                         ? AppendShellListPath(m_pFromBuf, m_nFromCap, m_nFromLen, m_pFromEnd, path, std::realloc)
-                         : AppendShellListPath(m_pToBuf, m_nToCap, m_nToLen, m_pToEnd, path, std::realloc);
+  const bool added = which == 0 ? AppendShellListPath(m_pFromBuf, m_nFromCap, m_nFromLen, m_pFromEnd, path, std::realloc)
+                                : AppendShellListPath(m_pToBuf, m_nToCap, m_nToLen, m_pToEnd, path, std::realloc);
   if (which == 0) {
     m_op.pFrom = m_pFromBuf;
     m_bFromIncomplete = m_bFromIncomplete || !added;

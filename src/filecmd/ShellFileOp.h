@@ -7,7 +7,7 @@
 #include <shellapi.h>
 
 class CShellFileOp {
-public:
+ public:
   CShellFileOp();
   // One call: adds the paths (a null path is left out), sets flags and title and runs kind
   // 1 move, 2 copy, 3 delete (flags become FOF_ALLOWUNDO) or 4 rename; another kind runs nothing.
@@ -38,7 +38,7 @@ public:
   const SHFILEOPSTRUCTA &GetOperation() const { return m_op; }
   int GetListSize(int which) const { return which == 0 ? m_nFromCap : m_nToCap; }
 
-private:
+ private:
   int Run(UINT function);
 
   int m_nFromCap = 0;

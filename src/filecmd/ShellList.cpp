@@ -3,8 +3,7 @@
 #include <climits>
 #include <cstring>
 
-bool AppendShellListPath(char *&buffer, int &capacity, int &used, char *&end, const char *path,
-                         ShellListReallocate reallocate) {
+bool AppendShellListPath(char *&buffer, int &capacity, int &used, char *&end, const char *path, ShellListReallocate reallocate) {
   // An empty path would end the list early and hide the paths after it.
   if (!path || !*path) return false;
   const size_t length = std::strlen(path) + 1;

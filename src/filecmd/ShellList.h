@@ -10,5 +10,4 @@ using ShellListReallocate = void *(*)(void *block, size_t size);
 // final NUL, end where the next path goes). For a null or empty path, a failed allocation, or
 // a list that would pass what an int counts, the list stays exactly as it was and false is
 // returned.
-bool AppendShellListPath(char *&buffer, int &capacity, int &used, char *&end, const char *path,
-                         ShellListReallocate reallocate);
+bool AppendShellListPath(char *&buffer, int &capacity, int &used, char *&end, const char *path, ShellListReallocate reallocate);

@@ -9,7 +9,7 @@ namespace fw {
 
 template <class T>
 class CArray {
-public:
+ public:
   int GetSize() const { return static_cast<int>(m_items.size()); }
   int GetCount() const { return GetSize(); }
   bool IsEmpty() const { return m_items.empty(); }
@@ -40,7 +40,7 @@ public:
   T *GetData() { return m_items.data(); }
   const T *GetData() const { return m_items.data(); }
 
-private:
+ private:
   size_t Checked(int index) const {
     if (index < 0 || static_cast<size_t>(index) >= m_items.size()) throw std::invalid_argument("array index out of range");
     return static_cast<size_t>(index);

@@ -9,7 +9,7 @@
 namespace fw {
 
 class CCmdUI {
-public:
+ public:
   virtual ~CCmdUI() = default;
   virtual void Enable(BOOL on = TRUE) = 0;
   virtual void SetCheck(int check = 1) = 0;
@@ -22,7 +22,7 @@ public:
 
 // The update request for an item of a pop-up menu that is about to open.
 class CMenuCmdUI : public CCmdUI {
-public:
+ public:
   CMenuCmdUI(HMENU menu, UINT index, UINT id) : m_hMenu(menu) {
     m_nIndex = index;
     m_nID = id;
@@ -30,11 +30,9 @@ public:
   void Enable(BOOL on = TRUE) override {
     EnableMenuItem(m_hMenu, m_nIndex, MF_BYPOSITION | (on ? MF_ENABLED : MF_DISABLED | MF_GRAYED));
   }
-  void SetCheck(int check = 1) override {
-    CheckMenuItem(m_hMenu, m_nIndex, MF_BYPOSITION | (check ? MF_CHECKED : MF_UNCHECKED));
-  }
+  void SetCheck(int check = 1) override { CheckMenuItem(m_hMenu, m_nIndex, MF_BYPOSITION | (check ? MF_CHECKED : MF_UNCHECKED)); }
 
-private:
+ private:
   HMENU m_hMenu;
 };
 

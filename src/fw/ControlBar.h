@@ -29,7 +29,7 @@ constexpr DWORD CBRS_BOTTOM = CBRS_ALIGN_BOTTOM | CBRS_BORDER_TOP;
 constexpr DWORD CBRS_ALL = 0x0040FFFF;
 
 class CControlBar : public CWnd {
-public:
+ public:
   DWORD GetBarStyle() const { return m_dwStyle; }
   void SetBarStyle(DWORD style) { m_dwStyle = style & CBRS_ALL; }
   void EnableDocking(DWORD sides) { m_dwDockStyle = sides & CBRS_ALIGN_ANY; }
@@ -43,7 +43,7 @@ public:
   // Idle-time update of the bar's items through the frame's command routing.
   virtual void OnUpdateCmdUI(CWnd *target) { (void)target; }
 
-protected:
+ protected:
   // Splits a Create style: window bits go to the window, CBRS_ bits stay with the bar.
   DWORD TakeBarStyle(DWORD style) {
     m_dwStyle = style & CBRS_ALL;

@@ -12,7 +12,7 @@ class CDialog;
 
 // One transfer between a dialog's members and its controls.
 class CDataExchange {
-public:
+ public:
   CDataExchange(CDialog *dialog, BOOL saveAndValidate) : m_pDlgWnd(dialog), m_bSaveAndValidate(saveAndValidate) {}
   HWND Control(int id) const;
 
@@ -26,7 +26,7 @@ void DDX_Text(CDataExchange *dx, int id, int &value);
 void DDX_Control(CDataExchange *dx, int id, CWnd &control);
 
 class CDialog : public CWnd {
-public:
+ public:
   explicit CDialog(UINT templateId, CWnd *parent = nullptr) : m_nIDTemplate(templateId), m_pParentWnd(parent) {}
 
   // Runs the dialog modally; the value given to EndDialog, or -1 when it could not run.
@@ -42,11 +42,11 @@ public:
   BOOL PreTranslateMessage(MSG *msg) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
-protected:
+ protected:
   UINT m_nIDTemplate;
   CWnd *m_pParentWnd;
 
-private:
+ private:
   void RunModalLoop();
 
   bool m_bInModalLoop = false;

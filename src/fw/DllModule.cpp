@@ -5,15 +5,15 @@
 extern "C" BOOL WINAPI DllMain(HINSTANCE instance, DWORD reason, LPVOID) {
   fw::CWinApp *application = fw::AfxGetApp();
   switch (reason) {
-  case DLL_PROCESS_ATTACH:
-    DisableThreadLibraryCalls(instance);
-    fw::AfxSetResourceHandle(instance);
-    if (!application) return TRUE;
-    application->m_hInstance = instance;
-    return application->InitInstance();
-  case DLL_PROCESS_DETACH:
-    if (application) application->ExitInstance();
-    return TRUE;
-  default: return TRUE;
+    case DLL_PROCESS_ATTACH:
+      DisableThreadLibraryCalls(instance);
+      fw::AfxSetResourceHandle(instance);
+      if (!application) return TRUE;
+      application->m_hInstance = instance;
+      return application->InitInstance();
+    case DLL_PROCESS_DETACH:
+      if (application) application->ExitInstance();
+      return TRUE;
+    default: return TRUE;
   }
 }

@@ -9,7 +9,7 @@ namespace fw {
 class CArchive;
 
 class CDocument {
-public:
+ public:
   CDocument();
   virtual ~CDocument();
   CDocument(const CDocument &) = delete;

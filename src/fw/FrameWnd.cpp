@@ -23,8 +23,8 @@ LPCSTR FrameClassName(UINT resourceId, HINSTANCE resources) {
   wc.hbrBackground = reinterpret_cast<HBRUSH>(COLOR_BTNFACE + 1);
   wc.hIcon = static_cast<HICON>(LoadImageA(resources, MAKEINTRESOURCEA(resourceId), IMAGE_ICON, GetSystemMetrics(SM_CXICON),
                                            GetSystemMetrics(SM_CYICON), LR_SHARED));
-  wc.hIconSm = static_cast<HICON>(LoadImageA(resources, MAKEINTRESOURCEA(resourceId), IMAGE_ICON,
-                                             GetSystemMetrics(SM_CXSMICON), GetSystemMetrics(SM_CYSMICON), LR_SHARED));
+  wc.hIconSm = static_cast<HICON>(LoadImageA(resources, MAKEINTRESOURCEA(resourceId), IMAGE_ICON, GetSystemMetrics(SM_CXSMICON),
+                                             GetSystemMetrics(SM_CYSMICON), LR_SHARED));
   wc.lpszClassName = name.c_str();
   RegisterClassExA(&wc);
   return name.c_str();
@@ -177,25 +177,27 @@ BOOL CFrameWnd::OnFrameCommand(UINT id, int code, CCmdUI *cmdUI) {
   const bool update = code == CN_UPDATE_COMMAND_UI;
   if (!update && code != CN_COMMAND) return FALSE;
   switch (id) {
-  case ID_VIEW_TOOLBAR:
-  case ID_VIEW_STATUS_BAR: {
-    CControlBar *bar = GetControlBar(id == ID_VIEW_TOOLBAR ? AFX_IDW_TOOLBAR : AFX_IDW_STATUS_BAR);
-    if (!bar) return FALSE;
-    if (update) cmdUI->SetCheck(bar->IsWindowVisible() ? 1 : 0);
-    else ShowControlBar(bar, !bar->IsWindowVisible());
-    return TRUE;
-  }
-  case ID_APP_EXIT:
-    if (!update) {
-      CWinApp *app = AfxGetApp();
-      if (app && app->m_pMainWnd) app->m_pMainWnd->PostMessage(WM_CLOSE);
+    case ID_VIEW_TOOLBAR:
+    case ID_VIEW_STATUS_BAR: {
+      CControlBar *bar = GetControlBar(id == ID_VIEW_TOOLBAR ? AFX_IDW_TOOLBAR : AFX_IDW_STATUS_BAR);
+      if (!bar) return FALSE;
+      if (update)
+        cmdUI->SetCheck(bar->IsWindowVisible() ? 1 : 0);
+      else
+        ShowControlBar(bar, !bar->IsWindowVisible());
+      return TRUE;
     }
-    return TRUE;
-  case ID_NEXT_PANE:
-  case ID_PREV_PANE:
-    if (!update) ActivateNextPane(id == ID_PREV_PANE);
-    return TRUE;
-  default: return FALSE;
+    case ID_APP_EXIT:
+      if (!update) {
+        CWinApp *app = AfxGetApp();
+        if (app && app->m_pMainWnd) app->m_pMainWnd->PostMessage(WM_CLOSE);
+      }
+      return TRUE;
+    case ID_NEXT_PANE:
+    case ID_PREV_PANE:
+      if (!update) ActivateNextPane(id == ID_PREV_PANE);
+      return TRUE;
+    default: return FALSE;
   }
 }
 
@@ -228,36 +230,41 @@ void CFrameWnd::OnInitMenuPopup(HMENU popup) {
 }
 
 void CFrameWnd::OnMenuSelect(UINT id, UINT flags, HMENU menu) {
-  if (flags == 0xFFFF && !menu) SetMessageText(AFX_IDS_IDLEMESSAGE);
-  else if (flags & (MF_POPUP | MF_SEPARATOR)) SetMessageText(std::string());
-  else SetMessageText(id);
+  if (flags == 0xFFFF && !menu)
+    SetMessageText(AFX_IDS_IDLEMESSAGE);
+  else if (flags & (MF_POPUP | MF_SEPARATOR))
+    SetMessageText(std::string());
+  else
+    SetMessageText(id);
 }
 
 LRESULT CFrameWnd::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
-  case WM_CREATE: return OnCreate(reinterpret_cast<CREATESTRUCTA *>(lParam));
-  case WM_SIZE:
-    if (wParam != SIZE_MINIMIZED) RecalcLayout();
-    return 0;
-  case WM_SETFOCUS:
-    if (m_pActiveView && m_pActiveView->m_hWnd) {
-      m_pActiveView->SetFocus();
+    case WM_CREATE: return OnCreate(reinterpret_cast<CREATESTRUCTA *>(lParam));
+    case WM_SIZE:
+      if (wParam != SIZE_MINIMIZED) RecalcLayout();
       return 0;
-    }
-    break;
-  case WM_CLOSE: DestroyWindow(); return 0;
-  case WM_DESTROY: OnDestroy(); break;
-  case WM_INITMENUPOPUP:
-    if (!HIWORD(lParam)) OnInitMenuPopup(reinterpret_cast<HMENU>(wParam));
-    return 0;
-  case WM_MENUSELECT: OnMenuSelect(LOWORD(wParam), HIWORD(wParam), reinterpret_cast<HMENU>(lParam)); return 0;
-  case WM_EXITMENULOOP: SetMessageText(AFX_IDS_IDLEMESSAGE); break;
-  case WM_SETMESSAGESTRING:
-    if (wParam) SetMessageText(static_cast<UINT>(wParam));
-    else SetMessageText(std::string(lParam ? reinterpret_cast<const char *>(lParam) : ""));
-    return 0;
-  case WM_IDLEUPDATECMDUI: OnIdleUpdate(); return 0;
-  default: break;
+    case WM_SETFOCUS:
+      if (m_pActiveView && m_pActiveView->m_hWnd) {
+        m_pActiveView->SetFocus();
+        return 0;
+      }
+      break;
+    case WM_CLOSE: DestroyWindow(); return 0;
+    case WM_DESTROY: OnDestroy(); break;
+    case WM_INITMENUPOPUP:
+      if (!HIWORD(lParam)) OnInitMenuPopup(reinterpret_cast<HMENU>(wParam));
+      return 0;
+    case WM_MENUSELECT: OnMenuSelect(LOWORD(wParam), HIWORD(wParam), reinterpret_cast<HMENU>(lParam)); return 0;
+    case WM_EXITMENULOOP: SetMessageText(AFX_IDS_IDLEMESSAGE); break;
+    case WM_SETMESSAGESTRING:
+      if (wParam)
+        SetMessageText(static_cast<UINT>(wParam));
+      else
+        SetMessageText(std::string(lParam ? reinterpret_cast<const char *>(lParam) : ""));
+      return 0;
+    case WM_IDLEUPDATECMDUI: OnIdleUpdate(); return 0;
+    default: break;
   }
   return CWnd::WindowProc(message, wParam, lParam);
 }

@@ -20,9 +20,8 @@ constexpr DWORD FWS_ADDTOTITLE = 0x00008000;
 constexpr UINT WM_SETMESSAGESTRING = 0x0362;  // wParam: string id, or lParam: the text
 constexpr UINT WM_IDLEUPDATECMDUI = 0x0363;
 
-
 class CFrameWnd : public CWnd {
-public:
+ public:
   CFrameWnd() = default;
 
   // Creates the frame from resource id with the given style, owned by owner.
@@ -53,7 +52,7 @@ public:
   BOOL OnCmdMsg(UINT id, int code, CCmdUI *cmdUI) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
-protected:
+ protected:
   virtual int OnCreate(CREATESTRUCTA *cs);
   // Creates the pane window; the base makes none.
   virtual BOOL OnCreateClient(CREATESTRUCTA *cs);
@@ -65,7 +64,7 @@ protected:
   HACCEL m_hAccelTable = nullptr;
   UINT m_nIDResource = 0;
 
-private:
+ private:
   // The views learn that their frame is complete, as a document template would tell them.
   void SendInitialUpdate();
   void OnInitMenuPopup(HMENU popup);

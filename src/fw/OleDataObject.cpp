@@ -8,7 +8,7 @@ FORMATETC HGlobalFormat(CLIPFORMAT format) { return {format, nullptr, DVASPECT_C
 
 // Releases a storage medium that came from another data object.
 class CStorageMedium {
-public:
+ public:
   CStorageMedium() { std::memset(&m_medium, 0, sizeof m_medium); }
   ~CStorageMedium() { ReleaseStgMedium(&m_medium); }
   CStorageMedium(const CStorageMedium &) = delete;

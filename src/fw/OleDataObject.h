@@ -10,7 +10,7 @@
 namespace fw {
 
 class COleDataObject {
-public:
+ public:
   // Takes the clipboard's current data object; false when the clipboard cannot be opened.
   bool AttachClipboard();
   void Release() { m_pDataObject.Reset(); }
@@ -19,7 +19,7 @@ public:
   // A copy of the data in global memory, owned by the caller; empty when not offered.
   CGlobalMemory GetGlobalData(CLIPFORMAT format) const;
 
-private:
+ private:
   Microsoft::WRL::ComPtr<IDataObject> m_pDataObject;
 };
 

@@ -14,7 +14,7 @@ FORMATETC HGlobalFormat(CLIPFORMAT format) { return {format, nullptr, DVASPECT_C
 // What the clipboard holds while it owns the data source: answers for the cached formats and
 // hands out a fresh copy of a block on each request.
 class CachedDataObject final : public IDataObject {
-public:
+ public:
   explicit CachedDataObject(std::vector<std::pair<CLIPFORMAT, CGlobalMemory>> cache) : m_cache(std::move(cache)) {}
 
   HRESULT STDMETHODCALLTYPE QueryInterface(REFIID iid, void **object) override {
@@ -65,13 +65,11 @@ public:
     for (const auto &entry : m_cache) offered.push_back(HGlobalFormat(entry.first));
     return SHCreateStdEnumFmtEtc(static_cast<UINT>(offered.size()), offered.data(), formats);
   }
-  HRESULT STDMETHODCALLTYPE DAdvise(FORMATETC *, DWORD, IAdviseSink *, DWORD *) override {
-    return OLE_E_ADVISENOTSUPPORTED;
-  }
+  HRESULT STDMETHODCALLTYPE DAdvise(FORMATETC *, DWORD, IAdviseSink *, DWORD *) override { return OLE_E_ADVISENOTSUPPORTED; }
   HRESULT STDMETHODCALLTYPE DUnadvise(DWORD) override { return OLE_E_ADVISENOTSUPPORTED; }
   HRESULT STDMETHODCALLTYPE EnumDAdvise(IEnumSTATDATA **) override { return OLE_E_ADVISENOTSUPPORTED; }
 
-private:
+ private:
   ~CachedDataObject() = default;
 
   HRESULT Find(const FORMATETC &format, HGLOBAL &block) const {

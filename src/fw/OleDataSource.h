@@ -13,7 +13,7 @@
 namespace fw {
 
 class COleDataSource {
-public:
+ public:
   COleDataSource() = default;
   COleDataSource(const COleDataSource &) = delete;
   COleDataSource &operator=(const COleDataSource &) = delete;
@@ -25,7 +25,7 @@ public:
   // not be set; the cache is given up in both cases.
   bool SetClipboard();
 
-private:
+ private:
   std::vector<std::pair<CLIPFORMAT, CGlobalMemory>> m_cache;
 };
 

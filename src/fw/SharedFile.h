@@ -18,7 +18,7 @@ using CGlobalMemory = std::unique_ptr<void, GlobalFreeDeleter>;
 
 // Locks a global block for the scope; Data() is null when the block could not be locked.
 class CGlobalLock {
-public:
+ public:
   explicit CGlobalLock(HGLOBAL memory)
       : m_hMemory(memory), m_pData(memory ? GlobalLock(memory) : nullptr), m_nSize(m_pData ? GlobalSize(memory) : 0) {}
   ~CGlobalLock() {
@@ -30,7 +30,7 @@ public:
   void *Data() const { return m_pData; }
   size_t Size() const { return m_nSize; }
 
-private:
+ private:
   HGLOBAL m_hMemory;
   void *m_pData;
   size_t m_nSize;
@@ -40,7 +40,7 @@ private:
 CGlobalMemory CopyGlobalMemory(HGLOBAL source);
 
 class CSharedFile {
-public:
+ public:
   explicit CSharedFile(UINT allocFlags = GMEM_MOVEABLE | GMEM_ZEROINIT | GMEM_SHARE, size_t growBytes = 4096);
   CSharedFile(const CSharedFile &) = delete;
   CSharedFile &operator=(const CSharedFile &) = delete;
@@ -52,7 +52,7 @@ public:
   // file is empty afterwards.
   CGlobalMemory Detach();
 
-private:
+ private:
   UINT m_nAllocFlags;
   size_t m_nGrowBytes;
   CGlobalMemory m_hMemory;

@@ -8,7 +8,7 @@ namespace fw {
 class CWnd;
 
 class CWinApp {
-public:
+ public:
   CWinApp();
   virtual ~CWinApp();
   CWinApp(const CWinApp &) = delete;
@@ -30,13 +30,13 @@ void AfxSetResourceHandle(HINSTANCE instance);
 // Makes this module's resources current for the lifetime of the scope, restoring the previous
 // ones after: a host calls into several modules on one thread.
 class CModuleStateScope {
-public:
+ public:
   CModuleStateScope();
   ~CModuleStateScope();
   CModuleStateScope(const CModuleStateScope &) = delete;
   CModuleStateScope &operator=(const CModuleStateScope &) = delete;
 
-private:
+ private:
   HINSTANCE m_previous;
 };
 

@@ -27,16 +27,16 @@ struct HookScope {
 
 bool IsReflected(UINT message) {
   switch (message) {
-  case WM_CTLCOLORBTN:
-  case WM_CTLCOLOREDIT:
-  case WM_CTLCOLORLISTBOX:
-  case WM_CTLCOLORSCROLLBAR:
-  case WM_CTLCOLORSTATIC:
-  case WM_HSCROLL:
-  case WM_VSCROLL:
-  case WM_DRAWITEM:
-  case WM_MEASUREITEM: return true;
-  default: return false;
+    case WM_CTLCOLORBTN:
+    case WM_CTLCOLOREDIT:
+    case WM_CTLCOLORLISTBOX:
+    case WM_CTLCOLORSCROLLBAR:
+    case WM_CTLCOLORSTATIC:
+    case WM_HSCROLL:
+    case WM_VSCROLL:
+    case WM_DRAWITEM:
+    case WM_MEASUREITEM: return true;
+    default: return false;
   }
 }
 
@@ -53,8 +53,8 @@ LRESULT CALLBACK AfxCbtHook(int code, WPARAM wParam, LPARAM lParam) {
     CWnd *wnd = t_creating;
     t_creating = nullptr;  // only the window being created; its children come with their own
     wnd->Attach(reinterpret_cast<HWND>(wParam));
-    wnd->m_superProc = reinterpret_cast<WNDPROC>(
-        SetWindowLongPtrA(wnd->m_hWnd, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(AfxWndProc)));
+    wnd->m_superProc =
+        reinterpret_cast<WNDPROC>(SetWindowLongPtrA(wnd->m_hWnd, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(AfxWndProc)));
   }
   return CallNextHookEx(t_cbtHook, code, wParam, lParam);
 }
@@ -112,16 +112,15 @@ void CWnd::Attach(HWND hwnd) {
 
 void CWnd::Detach() {
   if (!m_hWnd) return;
-  if (m_superProc && ::IsWindow(m_hWnd) &&
-      reinterpret_cast<WNDPROC>(GetWindowLongPtrA(m_hWnd, GWLP_WNDPROC)) == AfxWndProc)
+  if (m_superProc && ::IsWindow(m_hWnd) && reinterpret_cast<WNDPROC>(GetWindowLongPtrA(m_hWnd, GWLP_WNDPROC)) == AfxWndProc)
     SetWindowLongPtrA(m_hWnd, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(m_superProc));
   HandleMap().erase(m_hWnd);
   m_hWnd = nullptr;
   m_superProc = nullptr;
 }
 
-BOOL CWnd::CreateEx(DWORD exStyle, LPCSTR className, LPCSTR windowName, DWORD style, const RECT &rect, CWnd *parent,
-                    UINT id, LPVOID param) {
+BOOL CWnd::CreateEx(DWORD exStyle, LPCSTR className, LPCSTR windowName, DWORD style, const RECT &rect, CWnd *parent, UINT id,
+                    LPVOID param) {
   return CreateEx(exStyle, className, windowName, style, rect, parent ? parent->m_hWnd : nullptr, id, param);
 }
 
@@ -210,21 +209,21 @@ LRESULT CWnd::Default() { return DefWindowProc(m_current.message, m_current.wPar
 
 LRESULT CWnd::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
   switch (message) {
-  case WM_COMMAND:
-    if (OnCommand(wParam, lParam)) return 0;
-    break;
-  case WM_NOTIFY: {
-    LRESULT result = 0;
-    if (OnNotify(wParam, lParam, &result)) return result;
-    break;
-  }
-  default:
-    if (IsReflected(message)) {
+    case WM_COMMAND:
+      if (OnCommand(wParam, lParam)) return 0;
+      break;
+    case WM_NOTIFY: {
       LRESULT result = 0;
-      CWnd *child = FromHandlePermanent(ReflectionTarget(message, wParam, lParam));
-      if (child && child != this && child->OnChildNotify(message, wParam, lParam, &result)) return result;
+      if (OnNotify(wParam, lParam, &result)) return result;
+      break;
     }
-    break;
+    default:
+      if (IsReflected(message)) {
+        LRESULT result = 0;
+        CWnd *child = FromHandlePermanent(ReflectionTarget(message, wParam, lParam));
+        if (child && child != this && child->OnChildNotify(message, wParam, lParam, &result)) return result;
+      }
+      break;
   }
   return DefWindowProc(message, wParam, lParam);
 }

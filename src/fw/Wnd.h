@@ -16,7 +16,7 @@ constexpr int CN_COMMAND = 0;
 constexpr int CN_UPDATE_COMMAND_UI = -1;
 
 class CWnd {
-public:
+ public:
   CWnd() = default;
   virtual ~CWnd();
   CWnd(const CWnd &) = delete;
@@ -82,7 +82,7 @@ public:
 
   HWND m_hWnd = nullptr;
 
-protected:
+ protected:
   // Runs a creation call (CreateWindowEx, CreateDialogIndirectParam, ...) with this object
   // attached to the first window it creates, before that window's first message.
   HWND CreateAttached(HWND (*create)(void *context), void *context);
@@ -92,7 +92,7 @@ protected:
   virtual BOOL OnCommand(WPARAM wParam, LPARAM lParam);
   virtual BOOL OnNotify(WPARAM wParam, LPARAM lParam, LRESULT *result);
 
-private:
+ private:
   friend LRESULT CALLBACK AfxWndProc(HWND, UINT, WPARAM, LPARAM);
   friend LRESULT CALLBACK AfxCbtHook(int, WPARAM, LPARAM);
   void Attach(HWND hwnd);

@@ -5,7 +5,7 @@
 #include "host/HostApi.h"
 
 class ads_list_user {
-public:
+ public:
   ads_list_user() = default;
   explicit ads_list_user(resbuf *chain);
   ads_list_user(ads_list_user &other);
@@ -31,7 +31,7 @@ public:
   static resbuf *lastOf(resbuf *chain);
   static resbuf *copyNode(const resbuf *node);
 
-private:
+ private:
   resbuf *NewNode(short type, const ACHAR *failureMessage);
   void Append(resbuf *chain);
 

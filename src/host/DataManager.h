@@ -8,7 +8,7 @@
 
 template <class T>
 class AsdkDataManager : public AcApDocManagerReactor {
-public:
+ public:
   AsdkDataManager() {
     if (AcApDocManager *manager = acDocManagerPtr()) manager->addReactor(this);
   }
@@ -20,6 +20,6 @@ public:
 
   void documentToBeDestroyed(AcApDocument *document) override { m_records.erase(document); }
 
-private:
+ private:
   std::map<AcApDocument *, T> m_records;
 };

@@ -31,11 +31,11 @@ void InvokeFunction() {
 extern "C" __declspec(dllexport) int acrxEntryPoint(int message, void *appId) {
   try {
     switch (message) {
-    case kInitAppMsg: InitApplication(appId); break;
-    case kLoadDwgMsg: DefineFunctions(); break;
-    case kUnloadDwgMsg: UndefineFunctions(); break;
-    case kInvkSubrMsg: InvokeFunction(); break;
-    default: break;
+      case kInitAppMsg: InitApplication(appId); break;
+      case kLoadDwgMsg: DefineFunctions(); break;
+      case kUnloadDwgMsg: UndefineFunctions(); break;
+      case kInvkSubrMsg: InvokeFunction(); break;
+      default: break;
     }
   } catch (...) {
     // Nothing may unwind into the host; the call simply gives LISP no result of its own.

@@ -72,18 +72,18 @@ struct resbuf {
 
 // Host object model: only the operations the module uses.
 class AcRxObject {
-public:
+ public:
   virtual ~AcRxObject() = default;
   virtual const ACHAR *className() const = 0;
 };
 
 class AcRxDictionary : public AcRxObject {
-public:
+ public:
   virtual AcRxObject *at(const ACHAR *key) const = 0;
 };
 
 class AcRxDynamicLinker : public AcRxObject {
-public:
+ public:
   static constexpr const ACHAR *kClassName = L"AcRxDynamicLinker";
   virtual bool unlockApplication(void *appId) const = 0;
   virtual bool registerAppMDIAware(void *appId) const = 0;
@@ -100,14 +100,14 @@ public:
 class AcApDocument;
 
 class AcApDocManagerReactor {
-public:
+ public:
   virtual ~AcApDocManagerReactor() = default;
   virtual void documentCreated(AcApDocument *) {}
   virtual void documentToBeDestroyed(AcApDocument *) {}
 };
 
 class AcApDocManager {
-public:
+ public:
   virtual ~AcApDocManager() = default;
   virtual void addReactor(AcApDocManagerReactor *reactor) = 0;
   virtual void removeReactor(AcApDocManagerReactor *reactor) = 0;
@@ -115,7 +115,7 @@ public:
 
 // The host's application object: its main window owns the shell calls' dialogs.
 class CWinAppHost {
-public:
+ public:
   virtual ~CWinAppHost() = default;
   virtual void *mainWindow() const = 0;
 };

@@ -4,6 +4,6 @@
 #include "explorer/MdiMixin.h"
 
 class CQuillonApp : public CMdiMixin {
-public:
+ public:
   BOOL InitInstance() override;
 };

@@ -51,8 +51,7 @@ int RunLumvex() {
   ACHAR folder[kArgumentChars] = L"";
   ACHAR accept[kArgumentChars] = L"";
   ACHAR cancel[kArgumentChars] = L"";
-  if (!ReadLumvexArgs(first, second, {folder, kArgumentChars}, {accept, kArgumentChars}, {cancel, kArgumentChars}))
-    return 0;
+  if (!ReadLumvexArgs(first, second, {folder, kArgumentChars}, {accept, kArgumentChars}, {cancel, kArgumentChars})) return 0;
 
   StoreCaption(accept, "Ok", g_szAcceptCaption, sizeof g_szAcceptCaption);
   StoreCaption(cancel, "Cancel", g_szCancelCaption, sizeof g_szCancelCaption);

@@ -23,7 +23,9 @@ std::string FileBaseName(const std::string &path) {
 std::string ComposeStartShellPath(const ShellFolderNames &names, const std::string &driveDisplayName,
                                   const std::string &directory) {
   std::string path = names.desktop + "\\";
-  if (!driveDisplayName.empty()) path += names.drives + "\\" + driveDisplayName;
-  else path += names.network;
+  if (!driveDisplayName.empty())
+    path += names.drives + "\\" + driveDisplayName;
+  else
+    path += names.network;
   return path + directory;
 }

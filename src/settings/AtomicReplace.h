@@ -8,8 +8,8 @@
 // so a reader sees either the old file or the new one, never a part of either.
 
 // Pushes the stream's data through to the disk; the stream must be flushed first.
-bool CommitFileToDisk(std::FILE* file);
+bool CommitFileToDisk(std::FILE *file);
 
 // Puts the file `source` in the place of `target` (replacing it when it exists).
 // Both lie in the same folder. On failure `target` is left as it was.
-bool ReplaceFileAtomically(const std::string& source, const std::string& target);
+bool ReplaceFileAtomically(const std::string &source, const std::string &target);

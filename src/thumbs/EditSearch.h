@@ -4,7 +4,7 @@
 #include "fw/Controls.h"
 
 class CEditSearch : public fw::CEdit {
-public:
+ public:
   CEditSearch();
   ~CEditSearch() override;
 };

@@ -4,7 +4,7 @@
 #include "fw/View.h"
 
 class COmbra3View : public fw::CScrollView {
-public:
+ public:
   COmbra3View();
   ~COmbra3View() override;
 
@@ -22,7 +22,7 @@ public:
   BOOL OnCmdMsg(UINT id, int code, fw::CCmdUI *cmdUI) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
-private:
+ private:
   int m_nPictureWidth = 173;
   int m_nPictureHeight = 143;
 };

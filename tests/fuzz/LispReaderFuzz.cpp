@@ -12,23 +12,23 @@
 
 namespace {
 
-bool HasReal(const lisp::Value& value, bool& finite) {
+bool HasReal(const lisp::Value &value, bool &finite) {
   if (value.kind == lisp::Value::Kind::Real) {
     finite = finite && std::isfinite(value.real);
     return true;
   }
   bool found = false;
-  for (const lisp::Value& item : value.items) found = HasReal(item, finite) || found;
+  for (const lisp::Value &item : value.items) found = HasReal(item, finite) || found;
   return found;
 }
 
-void CheckRoundTrip(const lisp::Value& form) {
+void CheckRoundTrip(const lisp::Value &form) {
   const std::wstring printed = lisp::Prin1(form);
   lisp::Princ(form);
   std::vector<lisp::Value> again;
   try {
     again = lisp::ReadAll(printed);
-  } catch (const lisp::Error&) {
+  } catch (const lisp::Error &) {
     __builtin_trap();
   }
   if (again.size() != 1) __builtin_trap();
@@ -42,14 +42,14 @@ void CheckRoundTrip(const lisp::Value& form) {
 
 }  // namespace
 
-extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
+extern "C" int LLVMFuzzerTestOneInput(const uint8_t *data, size_t size) {
   const std::wstring source(data, data + size);
   std::vector<lisp::Value> forms;
   try {
     forms = lisp::ReadAll(source);
-  } catch (const lisp::Error&) {
+  } catch (const lisp::Error &) {
     return 0;
   }
-  for (const lisp::Value& form : forms) CheckRoundTrip(form);
+  for (const lisp::Value &form : forms) CheckRoundTrip(form);
   return 0;
 }

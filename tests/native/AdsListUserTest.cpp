@@ -36,7 +36,7 @@ std::vector<std::wstring> Failures() {
 }
 
 class AdsListUserTest : public ::testing::Test {
-protected:
+ protected:
   void SetUp() override {
     devhostClearEvents();
     devhostFailAllocationsAfter(-1);

@@ -10,9 +10,7 @@ namespace {
 const char kDwg[] = ".dwg";
 
 // The name the catalogue would hold, or "-" when the entry is not taken.
-std::string Taken(std::string name, bool isFolder = false) {
-  return TakeListingEntry(name.data(), isFolder, kDwg) ? name : "-";
-}
+std::string Taken(std::string name, bool isFolder = false) { return TakeListingEntry(name.data(), isFolder, kDwg) ? name : "-"; }
 
 TEST(ScanFilter, FilesAreTakenByExtensionWithoutRegardToCase) {
   EXPECT_EQ(Taken("A.DWG"), "a.dwg");

@@ -89,8 +89,7 @@ TEST(FileListBlock, BlockIsNeverReadPastItsEnd) {
 
 TEST(FileListBlock, WideListGivesWholePathsNotOneCharacterEach) {
   const std::u16string first = u"C:\\Pl\u00e4ne\\a.dwg", second = u"Z:\\notes.txt";
-  const std::string block = Header(20, 1) + WideBytes(first) + std::string(2, '\0') + WideBytes(second) +
-                            std::string(4, '\0');
+  const std::string block = Header(20, 1) + WideBytes(first) + std::string(2, '\0') + WideBytes(second) + std::string(4, '\0');
   FileListReader reader(block.data(), block.size());
   EXPECT_TRUE(reader.IsWide());
   std::string narrow;

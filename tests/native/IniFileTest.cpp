@@ -10,309 +10,288 @@
 
 namespace fs = std::filesystem;
 
-namespace
-{
-class IniFileTest : public ::testing::Test
-{
-protected:
-    void SetUp() override
-    {
-        const ::testing::TestInfo* info = ::testing::UnitTest::GetInstance()->current_test_info();
-        // Unique per run, so builds testing side by side do not share a folder.
-        const auto stamp = std::chrono::steady_clock::now().time_since_epoch().count();
-        m_folder = fs::temp_directory_path() /
-                   (std::string("IniFileTest-") + info->name() + "-" + std::to_string(stamp));
-        fs::create_directories(m_folder);
-        m_file = (m_folder / "datains.ini").string();
-    }
+namespace {
+class IniFileTest : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    const ::testing::TestInfo *info = ::testing::UnitTest::GetInstance()->current_test_info();
+    // Unique per run, so builds testing side by side do not share a folder.
+    const auto stamp = std::chrono::steady_clock::now().time_since_epoch().count();
+    m_folder = fs::temp_directory_path() / (std::string("IniFileTest-") + info->name() + "-" + std::to_string(stamp));
+    fs::create_directories(m_folder);
+    m_file = (m_folder / "datains.ini").string();
+  }
 
-    void TearDown() override { fs::remove_all(m_folder); }
+  void TearDown() override { fs::remove_all(m_folder); }
 
-    void Write(const std::string& bytes) const
-    {
-        std::ofstream(m_file, std::ios::binary) << bytes;
-    }
+  void Write(const std::string &bytes) const { std::ofstream(m_file, std::ios::binary) << bytes; }
 
-    std::string Read() const
-    {
-        std::ifstream in(m_file, std::ios::binary);
-        return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
-    }
+  std::string Read() const {
+    std::ifstream in(m_file, std::ios::binary);
+    return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
+  }
 
-    // Loads `bytes` into a fresh store.
-    CIniFile LoadBytes(const std::string& bytes) const
-    {
-        Write(bytes);
-        CIniFile ini;
-        ini.SetFilePath(m_file);
-        EXPECT_TRUE(ini.Load());
-        return ini;
-    }
-
-    std::string SaveBytes(CIniFile& ini) const
-    {
-        ini.SetFilePath(m_file);
-        ini.Save();
-        return Read();
-    }
-
-    fs::path m_folder;
-    std::string m_file;
-};
-
-void ExpectSameContent(const CIniFile& a, const CIniFile& b)
-{
-    ASSERT_EQ(a.m_names, b.m_names);
-    ASSERT_EQ(a.m_keys.size(), b.m_keys.size());
-    for (std::size_t i = 0; i < a.m_keys.size(); ++i)
-    {
-        EXPECT_EQ(a.m_keys[i].names, b.m_keys[i].names) << "section " << a.m_names[i];
-        EXPECT_EQ(a.m_keys[i].values, b.m_keys[i].values) << "section " << a.m_names[i];
-    }
-}
-} // namespace
-
-TEST_F(IniFileTest, SaveWritesCrLfAndAnEmptyLineAfterEverySectionWithEntries)
-{
-    CIniFile ini;
-    ini.SetString("Default Parameters", "Layer", "WALLS", true);
-    ini.SetString("Default Parameters", "Lisp command", "MYCMD", true);
-    ini.SetInt("Default Parameters", "Color", 1, true);
-    ini.SetString("Emptied", "gone", "1", true);
-    ini.DeleteEntry("Emptied", "gone");
-    ini.SetString("", "loose", " spaced = text ", true);
-
-    EXPECT_EQ(SaveBytes(ini),
-              "[Default Parameters]\r\nLayer=WALLS\r\nLisp command=MYCMD\r\nColor=1\r\n\r\n"
-              "[]\r\nloose= spaced = text \r\n\r\n");
-}
-
-TEST_F(IniFileTest, RepeatedSectionsMergeInFirstCreationOrder)
-{
-    CIniFile ini = LoadBytes("[A]\r\nx=1\r\n[B]\r\nx=2\r\n[A]\r\nx=3\r\n");
-    ASSERT_EQ(ini.SectionCount(), 2);
-    EXPECT_EQ(ini.m_names[0], "A");
-    EXPECT_EQ(ini.GetString("A", "x"), "3");
-    EXPECT_EQ(ini.GetString("B", "x"), "2");
-    EXPECT_EQ(SaveBytes(ini), "[A]\r\nx=3\r\n\r\n[B]\r\nx=2\r\n\r\n");
-}
-
-TEST_F(IniFileTest, LoadMergesIntoTheContentAndLoadingTwiceEqualsOnce)
-{
-    Write("[A]\nx=1\ny=2\n");
-    CIniFile once;
-    once.SetFilePath(m_file);
-    ASSERT_TRUE(once.Load());
-    CIniFile twice;
-    twice.SetFilePath(m_file);
-    ASSERT_TRUE(twice.Load());
-    ASSERT_TRUE(twice.Load());
-    ExpectSameContent(once, twice);
-
-    CIniFile filled;
-    filled.SetString("A", "x", "old", true);
-    filled.SetString("Kept", "k", "v", true);
-    filled.SetFilePath(m_file);
-    ASSERT_TRUE(filled.Load());
-    EXPECT_EQ(filled.GetString("A", "x"), "1");
-    EXPECT_EQ(filled.GetString("A", "y"), "2");
-    EXPECT_EQ(filled.GetString("Kept", "k"), "v");
-}
-
-TEST_F(IniFileTest, LineRules)
-{
-    CIniFile ini = LoadBytes("before=1\n"
-                             "\n"
-                             "[S]\n"
-                             "a=b=c\n"
-                             "abc\n"
-                             " [A]\n"
-                             "Layer = 0\n"
-                             ";note=x\n"
-                             "=lead\n"
-                             "[[a]]\n"
-                             "k=v\n"
-                             "[]\n"
-                             "e=1\n"
-                             "[lonely]\n");
-    EXPECT_EQ(ini.GetString("", "before"), "1");
-    EXPECT_EQ(ini.GetString("", "e"), "1");
-    EXPECT_EQ(ini.GetString("S", "a"), "b=c");
-    EXPECT_EQ(ini.GetString("S", "Layer "), " 0");
-    EXPECT_EQ(ini.GetString("S", ";note"), "x");
-    // "abc", " [A]" and "=lead" all set the entry with the empty name; the last wins.
-    EXPECT_EQ(ini.EntryCount("S"), 4);
-    EXPECT_EQ(ini.GetString("S", ""), "lead");
-    EXPECT_EQ(ini.GetString("a", "k"), "v");
-    EXPECT_EQ(ini.FindSection("lonely"), -1) << "a header alone creates no section";
-
-    EXPECT_EQ(LoadBytes("abc\n").GetString("", ""), "bc");
-    EXPECT_EQ(LoadBytes(" [A]\n").GetString("", ""), "[A]");
-}
-
-TEST_F(IniFileTest, LookupsAreExactAndReportWhatIsMissing)
-{
-    CIniFile ini = LoadBytes("[Size]\nWindowWidth=640\n");
-    EXPECT_EQ(ini.GetString("size", "WindowWidth"), "");
-    EXPECT_EQ(ini.m_error, "Unable to locate specified key.");
-    EXPECT_EQ(ini.GetString("Size", "windowwidth"), "");
-    EXPECT_EQ(ini.m_error, "Unable to locate specified value.");
-    EXPECT_EQ(ini.GetString("Size ", "WindowWidth"), "");
-    EXPECT_EQ(ini.m_error, "Unable to locate specified key.");
-    EXPECT_EQ(ini.GetString("Size", "WindowWidth"), "640");
-    EXPECT_EQ(ini.m_error, "Unable to locate specified key.") << "never cleared";
-}
-
-TEST_F(IniFileTest, LoadFailures)
-{
-    CIniFile ini;
-    ini.m_error = "earlier";
-    ini.SetFilePath((m_folder / "missing.ini").string());
-    EXPECT_FALSE(ini.Load());
-    EXPECT_EQ(ini.m_error, "earlier") << "a missing file is not an error";
-
-    ini.SetFilePath(m_folder.string());
-    EXPECT_FALSE(ini.Load());
-    EXPECT_EQ(ini.m_error, "Unable to open ini file.");
-    EXPECT_EQ(ini.SectionCount(), 0);
-}
-
-TEST_F(IniFileTest, LongLineEndsTheReading)
-{
-    CIniFile ini = LoadBytes("[A]\r\nx=1\r\n" + std::string(3000, 'y') + "\r\nz=2\r\n");
-    EXPECT_EQ(ini.EntryCount("A"), 1);
-    EXPECT_EQ(ini.GetString("A", "x"), "1");
-
-    // 2047 characters is the longest line kept, whatever its line end.
-    const std::string longest = "v=" + std::string(2045, 'w');
-    EXPECT_EQ(LoadBytes(longest + "\r\nlast=1").EntryCount(""), 2);
-    EXPECT_EQ(LoadBytes(longest + "\nlast=1").EntryCount(""), 2);
-    EXPECT_EQ(LoadBytes(longest).EntryCount(""), 1);
-    EXPECT_EQ(LoadBytes("a=1\n" + longest + "w\r\nlast=1").EntryCount(""), 1);
-    EXPECT_EQ(LoadBytes("a=1\n" + longest + "w").EntryCount(""), 1);
-}
-
-TEST_F(IniFileTest, LineEndsAndOddBytes)
-{
-    CIniFile ini = LoadBytes("[A]\r\ncrlf=1\r\nlf=2\ninner=a\rb\r\ntwo=3\r\r\nlast=4");
-    EXPECT_EQ(ini.GetString("A", "crlf"), "1");
-    EXPECT_EQ(ini.GetString("A", "lf"), "2");
-    EXPECT_EQ(ini.GetString("A", "inner"), "a\rb");
-    EXPECT_EQ(ini.GetString("A", "two"), "3\r") << "only the CR right before the LF goes";
-    EXPECT_EQ(ini.GetString("A", "last"), "4");
-
-    const std::string withNul("[N]\nna\0me=va\0lue\n", 17);
-    CIniFile nul = LoadBytes(withNul);
-    EXPECT_EQ(nul.GetString("N", std::string("na\0me", 5)), std::string("va\0lue", 6));
-    EXPECT_EQ(SaveBytes(nul), std::string("[N]\r\nna\0me=va\0lue\r\n\r\n", 21));
-}
-
-TEST_F(IniFileTest, LoadChangeSaveKeepsEverythingElse)
-{
-    Write("[Other]\r\nkeep=me\r\n\r\n[Default Parameters]\r\nLayer=A\r\nColor=3\r\n\r\n");
+  // Loads `bytes` into a fresh store.
+  CIniFile LoadBytes(const std::string &bytes) const {
+    Write(bytes);
     CIniFile ini;
     ini.SetFilePath(m_file);
-    ASSERT_TRUE(ini.Load());
-    ini.SetString("Default Parameters", "Layer", "B", true);
+    EXPECT_TRUE(ini.Load());
+    return ini;
+  }
+
+  std::string SaveBytes(CIniFile &ini) const {
+    ini.SetFilePath(m_file);
     ini.Save();
-    EXPECT_EQ(Read(), "[Other]\r\nkeep=me\r\n\r\n[Default Parameters]\r\nLayer=B\r\nColor=3\r\n\r\n");
+    return Read();
+  }
+
+  fs::path m_folder;
+  std::string m_file;
+};
+
+void ExpectSameContent(const CIniFile &a, const CIniFile &b) {
+  ASSERT_EQ(a.m_names, b.m_names);
+  ASSERT_EQ(a.m_keys.size(), b.m_keys.size());
+  for (std::size_t i = 0; i < a.m_keys.size(); ++i) {
+    EXPECT_EQ(a.m_keys[i].names, b.m_keys[i].names) << "section " << a.m_names[i];
+    EXPECT_EQ(a.m_keys[i].values, b.m_keys[i].values) << "section " << a.m_names[i];
+  }
+}
+}  // namespace
+
+TEST_F(IniFileTest, SaveWritesCrLfAndAnEmptyLineAfterEverySectionWithEntries) {
+  CIniFile ini;
+  ini.SetString("Default Parameters", "Layer", "WALLS", true);
+  ini.SetString("Default Parameters", "Lisp command", "MYCMD", true);
+  ini.SetInt("Default Parameters", "Color", 1, true);
+  ini.SetString("Emptied", "gone", "1", true);
+  ini.DeleteEntry("Emptied", "gone");
+  ini.SetString("", "loose", " spaced = text ", true);
+
+  EXPECT_EQ(SaveBytes(ini),
+            "[Default Parameters]\r\nLayer=WALLS\r\nLisp command=MYCMD\r\nColor=1\r\n\r\n"
+            "[]\r\nloose= spaced = text \r\n\r\n");
 }
 
-TEST_F(IniFileTest, SaveReplacesTheWholeFileOrNothing)
-{
-    Write(std::string(10000, 'x'));
-    CIniFile ini;
-    ini.SetString("A", "b", "c", true);
-    EXPECT_EQ(SaveBytes(ini), "[A]\r\nb=c\r\n\r\n");
-    EXPECT_FALSE(fs::exists(m_file + ".tmp"));
-
-    // The temporary file cannot be created: the old file stays as it was.
-    const std::string old = "[Old]\r\nkeep=1\r\n\r\n";
-    Write(old);
-    fs::create_directory(m_file + ".tmp");
-    ini.Save();
-    EXPECT_EQ(Read(), old);
-    fs::remove(m_file + ".tmp");
-
-    // The target cannot be replaced: no temporary file is left behind.
-    const fs::path folderTarget = m_folder / "folder.ini";
-    fs::create_directories(folderTarget / "inside");
-    ini.SetFilePath(folderTarget.string());
-    ini.Save();
-    EXPECT_TRUE(fs::is_directory(folderTarget / "inside"));
-    EXPECT_FALSE(fs::exists(folderTarget.string() + ".tmp"));
-
-    ini.SetFilePath((m_folder / "no such folder" / "x.ini").string());
-    ini.Save();
-    EXPECT_FALSE(fs::exists(m_folder / "no such folder"));
+TEST_F(IniFileTest, RepeatedSectionsMergeInFirstCreationOrder) {
+  CIniFile ini = LoadBytes("[A]\r\nx=1\r\n[B]\r\nx=2\r\n[A]\r\nx=3\r\n");
+  ASSERT_EQ(ini.SectionCount(), 2);
+  EXPECT_EQ(ini.m_names[0], "A");
+  EXPECT_EQ(ini.GetString("A", "x"), "3");
+  EXPECT_EQ(ini.GetString("B", "x"), "2");
+  EXPECT_EQ(SaveBytes(ini), "[A]\r\nx=3\r\n\r\n[B]\r\nx=2\r\n\r\n");
 }
 
-TEST_F(IniFileTest, SetStringCreatesOnlyWhenAsked)
-{
-    CIniFile ini;
-    EXPECT_FALSE(ini.SetString("A", "x", "1", false));
-    EXPECT_EQ(ini.SectionCount(), 0);
-    EXPECT_TRUE(ini.SetString("A", "x", "1", true));
-    EXPECT_TRUE(ini.SetString("A", "y", "2", true));
-    EXPECT_FALSE(ini.SetString("A", "z", "3", false));
-    EXPECT_TRUE(ini.SetString("A", "x", "changed", false));
-    EXPECT_EQ(ini.m_keys[0].names, (std::vector<std::string>{"x", "y"}));
-    EXPECT_EQ(ini.m_keys[0].values, (std::vector<std::string>{"changed", "2"}));
+TEST_F(IniFileTest, LoadMergesIntoTheContentAndLoadingTwiceEqualsOnce) {
+  Write("[A]\nx=1\ny=2\n");
+  CIniFile once;
+  once.SetFilePath(m_file);
+  ASSERT_TRUE(once.Load());
+  CIniFile twice;
+  twice.SetFilePath(m_file);
+  ASSERT_TRUE(twice.Load());
+  ASSERT_TRUE(twice.Load());
+  ExpectSameContent(once, twice);
+
+  CIniFile filled;
+  filled.SetString("A", "x", "old", true);
+  filled.SetString("Kept", "k", "v", true);
+  filled.SetFilePath(m_file);
+  ASSERT_TRUE(filled.Load());
+  EXPECT_EQ(filled.GetString("A", "x"), "1");
+  EXPECT_EQ(filled.GetString("A", "y"), "2");
+  EXPECT_EQ(filled.GetString("Kept", "k"), "v");
 }
 
-TEST_F(IniFileTest, NumbersAsText)
-{
-    CIniFile ini;
-    ini.SetInt("N", "int", -5, true);
-    ini.SetDouble("N", "double", 1.5, true);
-    EXPECT_EQ(ini.GetString("N", "int"), "-5");
-    EXPECT_EQ(ini.GetString("N", "double"), "1.500000e+00");
-    EXPECT_DOUBLE_EQ(ini.GetDouble("N", "double"), 1.5);
+TEST_F(IniFileTest, LineRules) {
+  CIniFile ini = LoadBytes(
+      "before=1\n"
+      "\n"
+      "[S]\n"
+      "a=b=c\n"
+      "abc\n"
+      " [A]\n"
+      "Layer = 0\n"
+      ";note=x\n"
+      "=lead\n"
+      "[[a]]\n"
+      "k=v\n"
+      "[]\n"
+      "e=1\n"
+      "[lonely]\n");
+  EXPECT_EQ(ini.GetString("", "before"), "1");
+  EXPECT_EQ(ini.GetString("", "e"), "1");
+  EXPECT_EQ(ini.GetString("S", "a"), "b=c");
+  EXPECT_EQ(ini.GetString("S", "Layer "), " 0");
+  EXPECT_EQ(ini.GetString("S", ";note"), "x");
+  // "abc", " [A]" and "=lead" all set the entry with the empty name; the last wins.
+  EXPECT_EQ(ini.EntryCount("S"), 4);
+  EXPECT_EQ(ini.GetString("S", ""), "lead");
+  EXPECT_EQ(ini.GetString("a", "k"), "v");
+  EXPECT_EQ(ini.FindSection("lonely"), -1) << "a header alone creates no section";
 
-    const struct
-    {
-        const char* text;
-        int number;
-    } ints[] = {{" \t-42abc", -42}, {"+7", 7}, {"x1", 0}, {"", 0}, {"-", 0},
-                {"99999999999999999999", 2147483647}, {"-2147483648", -2147483647 - 1},
-                {"-99999999999999999999", -2147483647 - 1}};
-    for (const auto& sample : ints)
-    {
-        ini.SetString("N", "i", sample.text, true);
-        EXPECT_EQ(ini.GetInt("N", "i"), sample.number) << '"' << sample.text << '"';
-    }
-    ini.SetString("N", "d", " -2.5e1rest", true);
-    EXPECT_DOUBLE_EQ(ini.GetDouble("N", "d"), -25.0);
-    ini.SetString("N", "d", "none", true);
-    EXPECT_EQ(ini.GetDouble("N", "d"), 0.0);
-    EXPECT_EQ(ini.GetInt("missing", "i"), 0);
-    EXPECT_EQ(ini.m_error, "Unable to locate specified key.");
+  EXPECT_EQ(LoadBytes("abc\n").GetString("", ""), "bc");
+  EXPECT_EQ(LoadBytes(" [A]\n").GetString("", ""), "[A]");
 }
 
-TEST_F(IniFileTest, DeletingAndCounting)
-{
-    CIniFile ini;
-    ini.SetString("A", "x", "1", true);
-    ini.SetString("A", "y", "2", true);
-    ini.SetString("B", "z", "3", true);
-    EXPECT_EQ(ini.EntryCount("A"), 2);
-    EXPECT_EQ(ini.EntryCount("none"), -1);
+TEST_F(IniFileTest, LookupsAreExactAndReportWhatIsMissing) {
+  CIniFile ini = LoadBytes("[Size]\nWindowWidth=640\n");
+  EXPECT_EQ(ini.GetString("size", "WindowWidth"), "");
+  EXPECT_EQ(ini.m_error, "Unable to locate specified key.");
+  EXPECT_EQ(ini.GetString("Size", "windowwidth"), "");
+  EXPECT_EQ(ini.m_error, "Unable to locate specified value.");
+  EXPECT_EQ(ini.GetString("Size ", "WindowWidth"), "");
+  EXPECT_EQ(ini.m_error, "Unable to locate specified key.");
+  EXPECT_EQ(ini.GetString("Size", "WindowWidth"), "640");
+  EXPECT_EQ(ini.m_error, "Unable to locate specified key.") << "never cleared";
+}
 
-    EXPECT_FALSE(ini.DeleteEntry("A", "none"));
-    EXPECT_FALSE(ini.DeleteEntry("none", "x"));
-    EXPECT_TRUE(ini.DeleteEntry("A", "x"));
-    EXPECT_EQ(ini.GetString("A", "y"), "2");
-    EXPECT_TRUE(ini.DeleteEntry("A", "y"));
-    EXPECT_EQ(ini.EntryCount("A"), 0);
-    EXPECT_EQ(SaveBytes(ini), "[B]\r\nz=3\r\n\r\n") << "a section without entries is not written";
+TEST_F(IniFileTest, LoadFailures) {
+  CIniFile ini;
+  ini.m_error = "earlier";
+  ini.SetFilePath((m_folder / "missing.ini").string());
+  EXPECT_FALSE(ini.Load());
+  EXPECT_EQ(ini.m_error, "earlier") << "a missing file is not an error";
 
-    EXPECT_FALSE(ini.DeleteSection("none"));
-    EXPECT_TRUE(ini.DeleteSection("A"));
-    EXPECT_EQ(ini.SectionCount(), 1);
-    EXPECT_EQ(ini.m_names[0], "B");
-    EXPECT_EQ(ini.GetString("B", "z"), "3");
+  ini.SetFilePath(m_folder.string());
+  EXPECT_FALSE(ini.Load());
+  EXPECT_EQ(ini.m_error, "Unable to open ini file.");
+  EXPECT_EQ(ini.SectionCount(), 0);
+}
 
-    ini.Clear();
-    EXPECT_EQ(ini.SectionCount(), 0);
-    EXPECT_EQ(ini.m_path, m_file) << "Clear keeps the path";
+TEST_F(IniFileTest, LongLineEndsTheReading) {
+  CIniFile ini = LoadBytes("[A]\r\nx=1\r\n" + std::string(3000, 'y') + "\r\nz=2\r\n");
+  EXPECT_EQ(ini.EntryCount("A"), 1);
+  EXPECT_EQ(ini.GetString("A", "x"), "1");
+
+  // 2047 characters is the longest line kept, whatever its line end.
+  const std::string longest = "v=" + std::string(2045, 'w');
+  EXPECT_EQ(LoadBytes(longest + "\r\nlast=1").EntryCount(""), 2);
+  EXPECT_EQ(LoadBytes(longest + "\nlast=1").EntryCount(""), 2);
+  EXPECT_EQ(LoadBytes(longest).EntryCount(""), 1);
+  EXPECT_EQ(LoadBytes("a=1\n" + longest + "w\r\nlast=1").EntryCount(""), 1);
+  EXPECT_EQ(LoadBytes("a=1\n" + longest + "w").EntryCount(""), 1);
+}
+
+TEST_F(IniFileTest, LineEndsAndOddBytes) {
+  CIniFile ini = LoadBytes("[A]\r\ncrlf=1\r\nlf=2\ninner=a\rb\r\ntwo=3\r\r\nlast=4");
+  EXPECT_EQ(ini.GetString("A", "crlf"), "1");
+  EXPECT_EQ(ini.GetString("A", "lf"), "2");
+  EXPECT_EQ(ini.GetString("A", "inner"), "a\rb");
+  EXPECT_EQ(ini.GetString("A", "two"), "3\r") << "only the CR right before the LF goes";
+  EXPECT_EQ(ini.GetString("A", "last"), "4");
+
+  const std::string withNul("[N]\nna\0me=va\0lue\n", 17);
+  CIniFile nul = LoadBytes(withNul);
+  EXPECT_EQ(nul.GetString("N", std::string("na\0me", 5)), std::string("va\0lue", 6));
+  EXPECT_EQ(SaveBytes(nul), std::string("[N]\r\nna\0me=va\0lue\r\n\r\n", 21));
+}
+
+TEST_F(IniFileTest, LoadChangeSaveKeepsEverythingElse) {
+  Write("[Other]\r\nkeep=me\r\n\r\n[Default Parameters]\r\nLayer=A\r\nColor=3\r\n\r\n");
+  CIniFile ini;
+  ini.SetFilePath(m_file);
+  ASSERT_TRUE(ini.Load());
+  ini.SetString("Default Parameters", "Layer", "B", true);
+  ini.Save();
+  EXPECT_EQ(Read(), "[Other]\r\nkeep=me\r\n\r\n[Default Parameters]\r\nLayer=B\r\nColor=3\r\n\r\n");
+}
+
+TEST_F(IniFileTest, SaveReplacesTheWholeFileOrNothing) {
+  Write(std::string(10000, 'x'));
+  CIniFile ini;
+  ini.SetString("A", "b", "c", true);
+  EXPECT_EQ(SaveBytes(ini), "[A]\r\nb=c\r\n\r\n");
+  EXPECT_FALSE(fs::exists(m_file + ".tmp"));
+
+  // The temporary file cannot be created: the old file stays as it was.
+  const std::string old = "[Old]\r\nkeep=1\r\n\r\n";
+  Write(old);
+  fs::create_directory(m_file + ".tmp");
+  ini.Save();
+  EXPECT_EQ(Read(), old);
+  fs::remove(m_file + ".tmp");
+
+  // The target cannot be replaced: no temporary file is left behind.
+  const fs::path folderTarget = m_folder / "folder.ini";
+  fs::create_directories(folderTarget / "inside");
+  ini.SetFilePath(folderTarget.string());
+  ini.Save();
+  EXPECT_TRUE(fs::is_directory(folderTarget / "inside"));
+  EXPECT_FALSE(fs::exists(folderTarget.string() + ".tmp"));
+
+  ini.SetFilePath((m_folder / "no such folder" / "x.ini").string());
+  ini.Save();
+  EXPECT_FALSE(fs::exists(m_folder / "no such folder"));
+}
+
+TEST_F(IniFileTest, SetStringCreatesOnlyWhenAsked) {
+  CIniFile ini;
+  EXPECT_FALSE(ini.SetString("A", "x", "1", false));
+  EXPECT_EQ(ini.SectionCount(), 0);
+  EXPECT_TRUE(ini.SetString("A", "x", "1", true));
+  EXPECT_TRUE(ini.SetString("A", "y", "2", true));
+  EXPECT_FALSE(ini.SetString("A", "z", "3", false));
+  EXPECT_TRUE(ini.SetString("A", "x", "changed", false));
+  EXPECT_EQ(ini.m_keys[0].names, (std::vector<std::string>{"x", "y"}));
+  EXPECT_EQ(ini.m_keys[0].values, (std::vector<std::string>{"changed", "2"}));
+}
+
+TEST_F(IniFileTest, NumbersAsText) {
+  CIniFile ini;
+  ini.SetInt("N", "int", -5, true);
+  ini.SetDouble("N", "double", 1.5, true);
+  EXPECT_EQ(ini.GetString("N", "int"), "-5");
+  EXPECT_EQ(ini.GetString("N", "double"), "1.500000e+00");
+  EXPECT_DOUBLE_EQ(ini.GetDouble("N", "double"), 1.5);
+
+  const struct {
+    const char *text;
+    int number;
+  } ints[] = {{" \t-42abc", -42},
+              {"+7", 7},
+              {"x1", 0},
+              {"", 0},
+              {"-", 0},
+              {"99999999999999999999", 2147483647},
+              {"-2147483648", -2147483647 - 1},
+              {"-99999999999999999999", -2147483647 - 1}};
+  for (const auto &sample : ints) {
+    ini.SetString("N", "i", sample.text, true);
+    EXPECT_EQ(ini.GetInt("N", "i"), sample.number) << '"' << sample.text << '"';
+  }
+  ini.SetString("N", "d", " -2.5e1rest", true);
+  EXPECT_DOUBLE_EQ(ini.GetDouble("N", "d"), -25.0);
+  ini.SetString("N", "d", "none", true);
+  EXPECT_EQ(ini.GetDouble("N", "d"), 0.0);
+  EXPECT_EQ(ini.GetInt("missing", "i"), 0);
+  EXPECT_EQ(ini.m_error, "Unable to locate specified key.");
+}
+
+TEST_F(IniFileTest, DeletingAndCounting) {
+  CIniFile ini;
+  ini.SetString("A", "x", "1", true);
+  ini.SetString("A", "y", "2", true);
+  ini.SetString("B", "z", "3", true);
+  EXPECT_EQ(ini.EntryCount("A"), 2);
+  EXPECT_EQ(ini.EntryCount("none"), -1);
+
+  EXPECT_FALSE(ini.DeleteEntry("A", "none"));
+  EXPECT_FALSE(ini.DeleteEntry("none", "x"));
+  EXPECT_TRUE(ini.DeleteEntry("A", "x"));
+  EXPECT_EQ(ini.GetString("A", "y"), "2");
+  EXPECT_TRUE(ini.DeleteEntry("A", "y"));
+  EXPECT_EQ(ini.EntryCount("A"), 0);
+  EXPECT_EQ(SaveBytes(ini), "[B]\r\nz=3\r\n\r\n") << "a section without entries is not written";
+
+  EXPECT_FALSE(ini.DeleteSection("none"));
+  EXPECT_TRUE(ini.DeleteSection("A"));
+  EXPECT_EQ(ini.SectionCount(), 1);
+  EXPECT_EQ(ini.m_names[0], "B");
+  EXPECT_EQ(ini.GetString("B", "z"), "3");
+
+  ini.Clear();
+  EXPECT_EQ(ini.SectionCount(), 0);
+  EXPECT_EQ(ini.m_path, m_file) << "Clear keeps the path";
 }

@@ -14,38 +14,37 @@ namespace {
 
 // A command line: every form of the input evaluated in order, as the host's session does.
 class LispEvaluator : public ::testing::Test {
-protected:
+ protected:
   LispEvaluator()
       : m_evaluator(
-            [this](const std::wstring& name,
-                   const std::vector<Value>& args) -> std::optional<Value> {
+            [this](const std::wstring &name, const std::vector<Value> &args) -> std::optional<Value> {
               calls.push_back(Value::List({Value::Sym(name), Value::List(args)}));
               if (name == L"LUMVEX") return Value::List({Value::Str(L"picked"), Value::List(args)});
               if (name == L"QUIET") return Value::Void();
               return std::nullopt;
             },
-            [this](const std::wstring& text) { output += text; }) {}
+            [this](const std::wstring &text) { output += text; }) {}
 
   // The last form's result as prin1 writes it.
-  std::wstring Run(const std::wstring& source) {
+  std::wstring Run(const std::wstring &source) {
     Value result;
-    for (const Value& form : lisp::ReadAll(source)) result = m_evaluator.Eval(form);
+    for (const Value &form : lisp::ReadAll(source)) result = m_evaluator.Eval(form);
     return lisp::Prin1(result);
   }
 
-  std::wstring WideFailure(const std::wstring& source) {
+  std::wstring WideFailure(const std::wstring &source) {
     try {
       Run(source);
-    } catch (const lisp::Error& error) {
+    } catch (const lisp::Error &error) {
       return lisp::WideMessage(error);
     }
     return L"(no error)";
   }
 
-  std::string Fails(const std::wstring& source) {
+  std::string Fails(const std::wstring &source) {
     try {
       Run(source);
-    } catch (const lisp::Error& error) {
+    } catch (const lisp::Error &error) {
       return error.what();
     }
     return "(no error)";
@@ -91,8 +90,7 @@ TEST_F(LispEvaluator, ListFunctions) {
   EXPECT_EQ(Run(L"(nth 1 '(a b))"), L"B");
   EXPECT_EQ(Run(L"(nth 2 '(a b))"), L"nil");
   EXPECT_EQ(Run(L"(nth -1 '(a b))"), L"nil");
-  EXPECT_EQ(Run(L"(list (atom 1) (atom nil) (atom '(1)) (listp nil) (listp 1))"),
-            L"(T T nil T nil)");
+  EXPECT_EQ(Run(L"(list (atom 1) (atom nil) (atom '(1)) (listp nil) (listp 1))"), L"(T T nil T nil)");
   EXPECT_EQ(Run(L"(list (not nil) (null 0) (equal '(1 \"a\") (list 1 \"a\")))"), L"(T nil T)");
   EXPECT_EQ(Fails(L"(car \"a\")"), "bad argument type: consp \"a\"");
   EXPECT_EQ(Fails(L"(length 5)"), "bad argument type: listp 5");
@@ -123,10 +121,8 @@ TEST_F(LispEvaluator, Arithmetic) {
 }
 
 TEST_F(LispEvaluator, Comparisons) {
-  EXPECT_EQ(Run(L"(list (= 1 1.0) (= 1 2) (= \"a\" \"a\") (= \"a\" 1) (/= 1 2))"),
-            L"(T nil T nil T)");
-  EXPECT_EQ(Run(L"(list (< 1 2 3) (< 1 3 2) (> 2.5 2) (<= 2 2) (>= 1 2) (< \"a\" \"b\"))"),
-            L"(T nil T T nil T)");
+  EXPECT_EQ(Run(L"(list (= 1 1.0) (= 1 2) (= \"a\" \"a\") (= \"a\" 1) (/= 1 2))"), L"(T nil T nil T)");
+  EXPECT_EQ(Run(L"(list (< 1 2 3) (< 1 3 2) (> 2.5 2) (<= 2 2) (>= 1 2) (< \"a\" \"b\"))"), L"(T nil T T nil T)");
   EXPECT_EQ(Fails(L"(< 1 \"a\")"), "bad argument type: numberp: \"a\"");
   EXPECT_EQ(Fails(L"(=)"), "too few arguments");
 }

@@ -10,9 +10,8 @@
 using lisp::Value;
 
 TEST(LispPrinter, BrowseResultPrintsAsAutoLisp) {
-  const Value result = Value::List(
-      {Value::Str(L"c:\\a\\b.dwg"),
-       Value::List({Value::Str(L"WALLS"), Value::Str(L"1"), Value::Str(L"MYCMD")})});
+  const Value result =
+      Value::List({Value::Str(L"c:\\a\\b.dwg"), Value::List({Value::Str(L"WALLS"), Value::Str(L"1"), Value::Str(L"MYCMD")})});
   EXPECT_EQ(lisp::Prin1(result), LR"(("c:\\a\\b.dwg" ("WALLS" "1" "MYCMD")))");
   EXPECT_EQ(lisp::Princ(result), LR"((c:\a\b.dwg (WALLS 1 MYCMD)))");
 }
@@ -48,14 +47,19 @@ TEST(LispPrinter, RealsWithSixSignificantDigitsAndAlwaysAPoint) {
       {INFINITY, L"1.#INF"},
       {-INFINITY, L"-1.#INF"},
   };
-  for (const auto& [value, text] : cases) {
+  for (const auto &[value, text] : cases) {
     EXPECT_EQ(lisp::Prin1(Value::Real(value)), text) << value;
   }
 }
 
 TEST(LispPrinter, StringEscapesForPrin1AndRawForPrinc) {
-  const std::wstring raw = L"q\"b\\s\nn\rr\tt\x1b" L"e\x01\x7f" L"z\u00e9";
-  EXPECT_EQ(lisp::Prin1(Value::Str(raw)), LR"("q\"b\\s\nn\rr\tt\ee\001\177z)" L"\u00e9\"");
+  const std::wstring raw =
+      L"q\"b\\s\nn\rr\tt\x1b"
+      L"e\x01\x7f"
+      L"z\u00e9";
+  EXPECT_EQ(lisp::Prin1(Value::Str(raw)),
+            LR"("q\"b\\s\nn\rr\tt\ee\001\177z)"
+            L"\u00e9\"");
   EXPECT_EQ(lisp::Princ(Value::Str(raw)), raw);
   EXPECT_EQ(lisp::Princ(Value::List({Value::Str(L"a b"), Value::Str(L"\"")})), L"(a b \")");
 }
@@ -79,13 +83,11 @@ TEST(LispPrinter, ReadingWhatPrin1WroteGivesTheValueBack) {
       Value::Str(L"\\0015 \\n"),
       Value::Sym(L"C:MYCMD"),
       Value::Sym(L"1+"),
-      Value::List({Value::Str(L"c:\\a\\b.dwg"),
-                   Value::List({Value::Str(L"WALLS"), Value::Str(L"1"), Value::Str(L"MYCMD")})}),
+      Value::List({Value::Str(L"c:\\a\\b.dwg"), Value::List({Value::Str(L"WALLS"), Value::Str(L"1"), Value::Str(L"MYCMD")})}),
       Value::List({Value::Sym(L"QUOTE"), Value::List({Value::Nil(), Value::Int(-1)})}),
   };
-  for (const Value& value : values) {
+  for (const Value &value : values) {
     const std::wstring text = lisp::Prin1(value);
-    EXPECT_EQ(lisp::ReadAll(text), std::vector<Value>{value})
-        << std::string(text.begin(), text.end());
+    EXPECT_EQ(lisp::ReadAll(text), std::vector<Value>{value}) << std::string(text.begin(), text.end());
   }
 }

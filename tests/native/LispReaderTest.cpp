@@ -9,22 +9,22 @@ using lisp::Value;
 
 namespace {
 
-Value ReadOne(const std::wstring& source) {
+Value ReadOne(const std::wstring &source) {
   auto forms = lisp::ReadAll(source);
   EXPECT_EQ(forms.size(), 1u) << "reading " << std::string(source.begin(), source.end());
   return forms.empty() ? Value::Nil() : forms.front();
 }
 
-std::string ReadError(const std::wstring& source) {
+std::string ReadError(const std::wstring &source) {
   try {
     lisp::ReadAll(source);
-  } catch (const lisp::Error& error) {
+  } catch (const lisp::Error &error) {
     return error.what();
   }
   return "(no error)";
 }
 
-Value Sym(const wchar_t* name) { return Value::Sym(name); }
+Value Sym(const wchar_t *name) { return Value::Sym(name); }
 
 }  // namespace
 
@@ -87,19 +87,14 @@ TEST(LispReader, StringEscapes) {
 
 TEST(LispReader, ListsQuotesAndComments) {
   EXPECT_EQ(ReadOne(L"(1 (2 \"x\") nil)"),
-            Value::List({Value::Int(1), Value::List({Value::Int(2), Value::Str(L"x")}),
-                         Value::Nil()}));
+            Value::List({Value::Int(1), Value::List({Value::Int(2), Value::Str(L"x")}), Value::Nil()}));
   EXPECT_EQ(ReadOne(L"'x"), Value::List({Sym(L"QUOTE"), Sym(L"X")}));
-  EXPECT_EQ(ReadOne(L"''x"),
-            Value::List({Sym(L"QUOTE"), Value::List({Sym(L"QUOTE"), Sym(L"X")})}));
-  EXPECT_EQ(ReadOne(L"'(a 'b)"),
-            Value::List({Sym(L"QUOTE"),
-                         Value::List({Sym(L"A"), Value::List({Sym(L"QUOTE"), Sym(L"B")})})}));
+  EXPECT_EQ(ReadOne(L"''x"), Value::List({Sym(L"QUOTE"), Value::List({Sym(L"QUOTE"), Sym(L"X")})}));
+  EXPECT_EQ(ReadOne(L"'(a 'b)"), Value::List({Sym(L"QUOTE"), Value::List({Sym(L"A"), Value::List({Sym(L"QUOTE"), Sym(L"B")})})}));
   EXPECT_EQ(ReadOne(L"(a\"b\"c)"), Value::List({Sym(L"A"), Value::Str(L"b"), Sym(L"C")}));
   EXPECT_EQ(ReadOne(L"(a;comment ) (\n b)"), Value::List({Sym(L"A"), Sym(L"B")}));
   EXPECT_EQ(ReadOne(L"(a ;| inline ) |; b)"), Value::List({Sym(L"A"), Sym(L"B")}));
-  EXPECT_EQ(lisp::ReadAll(L"1 \"two\" three ; the end"),
-            (std::vector<Value>{Value::Int(1), Value::Str(L"two"), Sym(L"THREE")}));
+  EXPECT_EQ(lisp::ReadAll(L"1 \"two\" three ; the end"), (std::vector<Value>{Value::Int(1), Value::Str(L"two"), Sym(L"THREE")}));
   EXPECT_TRUE(lisp::ReadAll(L"  ; only a comment\n\t").empty());
   EXPECT_TRUE(lisp::ReadAll(L";| never closed").empty());
 }
@@ -129,14 +124,12 @@ TEST(LispReader, MalformedInputMessages) {
 TEST(LispReader, NestingIsLimitedWithoutExhaustingTheStack) {
   const int limit = lisp::kMaxReadDepth;
   const Value deepest = ReadOne(std::wstring(limit, L'(') + L"1" + std::wstring(limit, L')'));
-  const Value* inner = &deepest;
+  const Value *inner = &deepest;
   for (int level = 1; level < limit; ++level) inner = &inner->items.front();
   EXPECT_EQ(*inner, Value::List({Value::Int(1)}));
 
-  EXPECT_EQ(ReadError(std::wstring(limit + 1, L'(') + std::wstring(limit + 1, L')')),
-            "input nested too deeply");
+  EXPECT_EQ(ReadError(std::wstring(limit + 1, L'(') + std::wstring(limit + 1, L')')), "input nested too deeply");
   EXPECT_EQ(ReadError(std::wstring(1000000, L'(')), "input nested too deeply");
   EXPECT_EQ(ReadError(std::wstring(1000000, L'\'') + L"x"), "input nested too deeply");
-  EXPECT_EQ(ReadError(std::wstring(600, L'(') + std::wstring(600, L'\'') + L"x"),
-            "input nested too deeply");
+  EXPECT_EQ(ReadError(std::wstring(600, L'(') + std::wstring(600, L'\'') + L"x"), "input nested too deeply");
 }

@@ -25,9 +25,7 @@ using Names3 = std::vector<std::string>;
 
 // Listing order deliberately differs from every sorted order, and the smallest/oldest record
 // is the last one so that sorting must reach it.
-DwgCatalogue Listing() {
-  return Catalogue({DwgData("b.dwg", 200, 30), DwgData("c.dwg", 300, 20), DwgData("a.dwg", 100, 10)});
-}
+DwgCatalogue Listing() { return Catalogue({DwgData("b.dwg", 200, 30), DwgData("c.dwg", 300, 20), DwgData("a.dwg", 100, 10)}); }
 
 TEST(Ordering, ByNameDateAndSizeAscending) {
   DwgCatalogue catalogue = Listing();
@@ -56,8 +54,16 @@ TEST(Ordering, ByNameIsTheOrderOfTheComparisonForAnyName) {
   // Long shared beginnings, capitals, short names and bytes past ASCII before and after the
   // 16th byte: the name sort must agree with CompareByName on every one.
   std::vector<DwgData> records;
-  const char *stems[] = {"project-level-01-", "PROJECT-LEVEL-01-", "project-level-0", "p", "\xC4rger-", "plan\xE4-",
-                         "project-level-01-\xC4-", "z", "_", "project-level-01-a"};
+  const char *stems[] = {"project-level-01-",
+                         "PROJECT-LEVEL-01-",
+                         "project-level-0",
+                         "p",
+                         "\xC4rger-",
+                         "plan\xE4-",
+                         "project-level-01-\xC4-",
+                         "z",
+                         "_",
+                         "project-level-01-a"};
   int number = 0;
   for (const char *stem : stems)
     for (int i = 0; i < 12; ++i) records.emplace_back(stem + std::to_string(number++ * 37 % 1000) + ".dwg", 0, 0);

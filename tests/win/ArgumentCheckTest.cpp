@@ -11,7 +11,7 @@ const wchar_t *const kMissing = L"\nMissing parametrs\n";
 const wchar_t *const kWrongType = L"\nArgument should be an short";
 
 class ArgumentCheck : public ::testing::Test {
-protected:
+ protected:
   void SetUp() override {
     ASSERT_EQ(m_module.LoadResult(), kDevhostLoaded);
     m_liveBefore = devhostLiveResbufCount();
@@ -52,7 +52,8 @@ TEST_F(ArgumentCheck, NoArgumentsAtAll) {
 TEST_F(ArgumentCheck, FirstArgumentNotAShort) {
   EXPECT_EQ(Call(acutBuildList(RTSTR, L"0", RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", 0)),
             (std::vector<HostEvent>{Printed(kWrongType), Alerted(kWrongType), Released(5)}));
-  EXPECT_EQ(Call(acutBuildList(RTLONG, 70000, 0)), (std::vector<HostEvent>{Printed(kWrongType), Alerted(kWrongType), Released(1)}));
+  EXPECT_EQ(Call(acutBuildList(RTLONG, 70000, 0)),
+            (std::vector<HostEvent>{Printed(kWrongType), Alerted(kWrongType), Released(1)}));
   EXPECT_EQ(devhostResultKind(), RTNONE);
 }
 
@@ -79,9 +80,8 @@ TEST_F(ArgumentCheck, WellTypedCallReleasesItsArgumentsAndGivesNilWhenCancelled)
 }
 
 TEST_F(ArgumentCheck, ExtraArgumentsAreIgnored) {
-  EXPECT_EQ(
-      CallAndCancel(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", RTSHORT, 7, RTSTR, L"x", 0)),
-      (std::vector<HostEvent>{Released(7)}));
+  EXPECT_EQ(CallAndCancel(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", RTSHORT, 7, RTSTR, L"x", 0)),
+            (std::vector<HostEvent>{Released(7)}));
   EXPECT_EQ(m_resultKind, RTNIL);
 }
 

@@ -26,14 +26,12 @@ std::string ReadFile(const std::string &path) {
   return content.str();
 }
 
-void WriteFile(const std::string &path, const std::string &content) {
-  std::ofstream(path, std::ios::binary) << content;
-}
+void WriteFile(const std::string &path, const std::string &content) { std::ofstream(path, std::ios::binary) << content; }
 
 bool Exists(const std::string &path) { return GetFileAttributesA(path.c_str()) != INVALID_FILE_ATTRIBUTES; }
 
 class ExplorerState : public ::testing::Test {
-protected:
+ protected:
   void SetUp() override { Clean(); }
   void TearDown() override { Clean(); }
   static void Clean() {

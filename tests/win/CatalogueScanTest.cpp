@@ -57,7 +57,7 @@ const DwgData *Record(const std::string &name) {
 
 // The document writes its state file beside the test program; a scan test leaves none behind.
 class WithDocument {
-public:
+ public:
   ~WithDocument() {
     const std::string stateFile = m_document->m_iniFile.m_path;
     m_document.reset();
@@ -65,12 +65,12 @@ public:
   }
   COmbra3Doc &Document() { return *m_document; }
 
-private:
+ private:
   std::unique_ptr<COmbra3Doc> m_document = std::make_unique<COmbra3Doc>();
 };
 
 class CatalogueScan : public ::testing::Test {
-protected:
+ protected:
   void TearDown() override { EmptyCatalogue(); }
 };
 
@@ -87,7 +87,7 @@ TEST_F(CatalogueScan, TakesDrawingsByNameInListingOrder) {
 
 TEST_F(CatalogueScan, RecordsCarryTimeAndSizeOfTheListing) {
   TestFolder folder("fields");
-  folder.AddFile("Small.dwg", 12, 946684800);  // 2000-01-01
+  folder.AddFile("Small.dwg", 12, 946684800);      // 2000-01-01
   folder.AddFile("large.dwg", 70000, 4102444800);  // 2100-01-01, past 32-bit seconds
   ASSERT_TRUE(ScanFolder(folder.Path(), kDwg));
 
@@ -185,8 +185,29 @@ int Sign(int value) { return (value > 0) - (value < 0); }
 TEST(CompareNoCase, AgreesWithTheRunTime) {
   // ASCII takes a quicker path than the run time's comparison: both must order alike,
   // also for the signs between "Z" and "a" and for bytes past ASCII.
-  const char *texts[] = {"", "a", "A", "b", "_", "[", "^", "`", "{", "~", "plan", "PLAN", "plan-a", "plan.dwg",
-                         "plan2", "Z", "z", "\xC4", "\xE4", "a\xC4", "a\xE4b", "\xFF"};
+  const char *texts[] = {"",
+                         "a",
+                         "A",
+                         "b",
+                         "_",
+                         "[",
+                         "^",
+                         "`",
+                         "{",
+                         "~",
+                         "plan",
+                         "PLAN",
+                         "plan-a",
+                         "plan.dwg",
+                         "plan2",
+                         "Z",
+                         "z",
+                         "\xC4",
+                         "\xE4",
+                         "a\xC4",
+                         "a\xE4"
+                         "b",
+                         "\xFF"};
   for (const char *a : texts)
     for (const char *b : texts)
       EXPECT_EQ(Sign(CompareNoCase(a, b)),

@@ -7,7 +7,7 @@
 #include <string>
 
 class TestFolder {
-public:
+ public:
   explicit TestFolder(const std::string &name) {
     char temp[MAX_PATH] = "";
     GetTempPathA(MAX_PATH, temp);
@@ -30,7 +30,8 @@ public:
 
   // A file of `size` bytes last written at `unixSeconds`.
   void AddFile(const std::string &name, DWORD size = 0, long long unixSeconds = 1500000000) const {
-    const HANDLE file = CreateFileA((*this / name).c_str(), GENERIC_WRITE, 0, nullptr, CREATE_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
+    const HANDLE file =
+        CreateFileA((*this / name).c_str(), GENERIC_WRITE, 0, nullptr, CREATE_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
     if (file == INVALID_HANDLE_VALUE) return;
     const std::string content(size, 'x');
     DWORD written = 0;
@@ -43,7 +44,7 @@ public:
     CloseHandle(file);
   }
 
-private:
+ private:
   void Remove() const {
     std::error_code ignored;
     std::filesystem::remove_all(m_path, ignored);

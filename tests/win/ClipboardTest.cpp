@@ -1,5 +1,6 @@
 // The file list on the real OLE clipboard: the view's copy read back by another process, and
 // paste of lists written as this program and as the Windows shell write them.
+#include "ScratchFolder.h"
 #include "filecmd/ForFileCommands.h"
 #include "filecmd/SelectionCommands.h"
 #include "fw/SharedFile.h"
@@ -18,49 +19,21 @@ namespace {
 namespace fs = std::filesystem;
 
 class OleEnvironment : public ::testing::Environment {
-public:
+ public:
   void SetUp() override { ASSERT_TRUE(SUCCEEDED(OleInitialize(nullptr))); }
   void TearDown() override { OleUninitialize(); }
 };
 const auto *const oleEnvironment = ::testing::AddGlobalTestEnvironment(new OleEnvironment);
 
-class ScratchFolder {
-public:
-  explicit ScratchFolder(const char *tag)
-      : m_path(fs::temp_directory_path() / (std::string(tag) + "-" + std::to_string(GetTickCount64()))) {
-    fs::create_directories(m_path);
-  }
-  ~ScratchFolder() {
-    std::error_code ignored;
-    fs::remove_all(m_path, ignored);
-  }
-  std::string Path() const { return m_path.string(); }
-  // Narrow names are ANSI text, as the module's paths are: kept off std::filesystem's own
-  // conversion.
-  std::string File(const std::string &name, const char *content = nullptr) const {
-    const std::string file = m_path.string() + "\\" + name;
-    if (content) std::ofstream(file.c_str(), std::ios::binary) << content;
-    return file;
-  }
-
-private:
-  fs::path m_path;
-};
-
 // Paste goes to the current directory, as after a folder scan.
 class CurrentDirectory {
-public:
+ public:
   explicit CurrentDirectory(const std::string &folder) : m_previous(fs::current_path()) { fs::current_path(folder); }
   ~CurrentDirectory() { fs::current_path(m_previous); }
 
-private:
+ private:
   fs::path m_previous;
 };
-
-std::string Content(const std::string &path) {
-  std::ifstream in(path.c_str(), std::ios::binary);
-  return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
-}
 
 // Runs the reader program beside this one and returns what it printed.
 std::string ReadClipboardInAnotherProcess() {

@@ -33,7 +33,7 @@ std::string IniValue(const std::string &ini, const std::string &key) {
 void Command(HWND frame, int id) { PostMessageA(frame, WM_COMMAND, id, 0); }
 
 class ExplorerFrame : public ::testing::Test {
-protected:
+ protected:
   // The host runs with OLE initialised on its thread, as the CAD application does.
   static void SetUpTestSuite() { OleInitialize(nullptr); }
   static void TearDownTestSuite() { OleUninitialize(); }
@@ -366,8 +366,9 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
     const char *settings;  // nullptr: no datains.ini
     const char *label;
   };
-  for (const Case &c : {Case{nullptr, " Layer name: Current"}, Case{"[Default Parameters]\r\nLayer=\r\nColor=3\r\n", " Layer name: Current"},
-                        Case{"[Default Parameters]\r\nLayer=WALLS\r\n", " Layer name: WALLS"}}) {
+  for (const Case &c :
+       {Case{nullptr, " Layer name: Current"}, Case{"[Default Parameters]\r\nLayer=\r\nColor=3\r\n", " Layer name: Current"},
+        Case{"[Default Parameters]\r\nLayer=WALLS\r\n", " Layer name: WALLS"}}) {
     const std::string folder = TempFolder("lumvex-paste-target");
     if (c.settings) std::ofstream(folder + "\\datains.ini", std::ios::binary) << c.settings;
     m_state.Write(StateFile(0, 0, 0, folder));

@@ -16,15 +16,17 @@
 
 // Keeps the module's state file as it was before the test and restores it after.
 class StateFileGuard {
-public:
+ public:
   StateFileGuard() : m_path(Narrow(ProgramFolder()) + "Lumvex1.ini") {
     std::ifstream in(m_path, std::ios::binary);
     m_existed = in.good();
     if (m_existed) m_content.assign(std::istreambuf_iterator<char>(in), {});
   }
   ~StateFileGuard() {
-    if (m_existed) std::ofstream(m_path, std::ios::binary) << m_content;
-    else DeleteFileA(m_path.c_str());
+    if (m_existed)
+      std::ofstream(m_path, std::ios::binary) << m_content;
+    else
+      DeleteFileA(m_path.c_str());
   }
   StateFileGuard(const StateFileGuard &) = delete;
   StateFileGuard &operator=(const StateFileGuard &) = delete;
@@ -39,7 +41,7 @@ public:
 
   static std::string Narrow(const std::wstring &text) { return std::string(text.begin(), text.end()); }
 
-private:
+ private:
   std::string m_path;
   bool m_existed = false;
   std::string m_content;

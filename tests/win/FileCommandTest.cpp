@@ -1,5 +1,6 @@
 // Delete to the recycle bin and rename, through the real shell: its confirmation is answered
 // by a watcher that finds the dialog and presses a button, as a person would.
+#include "ScratchFolder.h"
 #include "filecmd/ForFileCommands.h"
 #include "filecmd/SelectionCommands.h"
 #include "filecmd/ShellFileOp.h"
@@ -15,31 +16,6 @@
 
 namespace {
 namespace fs = std::filesystem;
-
-class ScratchFolder {
-public:
-  ScratchFolder() : m_path(fs::temp_directory_path() / ("filecmd-" + std::to_string(GetTickCount64()))) {
-    fs::create_directories(m_path);
-  }
-  ~ScratchFolder() {
-    std::error_code ignored;
-    fs::remove_all(m_path, ignored);
-  }
-  std::string Path() const { return m_path.string(); }
-  std::string File(const std::string &name, const char *content = nullptr) const {
-    const fs::path file = m_path / name;
-    if (content) std::ofstream(file, std::ios::binary) << content;
-    return file.string();
-  }
-
-private:
-  fs::path m_path;
-};
-
-std::string Content(const std::string &path) {
-  std::ifstream in(path, std::ios::binary);
-  return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
-}
 
 // The XDG trash the shell moves deleted files to, seen through drive Z:.
 fs::path TrashFiles() {
@@ -63,7 +39,7 @@ void RemoveFromTrash(const std::string &name) {
 
 // Waits on its own thread for a dialog of this process that has the button, and presses it.
 class DialogAnswerer {
-public:
+ public:
   explicit DialogAnswerer(int buttonId) : m_nButton(buttonId), m_thread([this] { Watch(); }) {}
   ~DialogAnswerer() { Caption(); }
   DialogAnswerer(const DialogAnswerer &) = delete;
@@ -76,7 +52,7 @@ public:
     return m_caption;
   }
 
-private:
+ private:
   struct Search {
     int button;
     HWND found;
@@ -126,7 +102,7 @@ DwgCatalogue Catalogue(std::initializer_list<const char *> names) {
 }
 
 TEST(FileCommandDelete, ConfirmedDeleteMovesTheMarkedDrawingToTheTrash) {
-  ScratchFolder folder;
+  ScratchFolder folder("filecmd");
   const std::string name = "gone-" + std::to_string(GetTickCount64()) + ".dwg";
   folder.File(name, "drawing");
   folder.File("kept.dwg", "other");
@@ -144,7 +120,7 @@ TEST(FileCommandDelete, ConfirmedDeleteMovesTheMarkedDrawingToTheTrash) {
 }
 
 TEST(FileCommandDelete, AnsweringNoKeepsTheFileAndSetsTheAbortedFlag) {
-  ScratchFolder folder;
+  ScratchFolder folder("filecmd");
   const std::string path = folder.File("plan.dwg", "plan");
   CShellFileOp operation;
   operation.AddFile(0, path.c_str());
@@ -156,7 +132,7 @@ TEST(FileCommandDelete, AnsweringNoKeepsTheFileAndSetsTheAbortedFlag) {
 }
 
 TEST(FileCommandDelete, NothingMarkedDeletesNothingAndAsksNothing) {
-  ScratchFolder folder;
+  ScratchFolder folder("filecmd");
   folder.File("a.dwg", "a");
   const DwgCatalogue catalogue = Catalogue({"a.dwg"});
   DialogAnswerer yes(kYes);
@@ -166,7 +142,7 @@ TEST(FileCommandDelete, NothingMarkedDeletesNothingAndAsksNothing) {
 }
 
 TEST(FileCommandRename, RenameToAFreeName) {
-  ScratchFolder folder;
+  ScratchFolder folder("filecmd");
   const std::string from = folder.File("plan.dwg", "plan");
   const std::string to = folder.File("plan2.dwg");
   EXPECT_EQ(ForFileCommands().RenameFile(from.c_str(), to.c_str(), nullptr), 0);
@@ -175,7 +151,7 @@ TEST(FileCommandRename, RenameToAFreeName) {
 }
 
 TEST(FileCommandRename, RenameOntoATakenNameIsRefusedAndLosesNothing) {
-  ScratchFolder folder;
+  ScratchFolder folder("filecmd");
   const std::string from = folder.File("plan.dwg", "plan");
   const std::string to = folder.File("site.dwg", "site");
   DialogAnswerer yes(kYes);

@@ -18,7 +18,7 @@ inline std::wstring ProgramFolder() {
 }
 
 class LoadedModule {
-public:
+ public:
   explicit LoadedModule(int drawings = 1) {
     devhostSetBatchMode(true);  // alerts as lines on standard error, not message boxes
     for (int i = 0; i < drawings; ++i) devhostOpenDrawing();
@@ -34,7 +34,7 @@ public:
 
   int LoadResult() const { return m_loadResult; }
 
-private:
+ private:
   int m_loadResult;
 };
 

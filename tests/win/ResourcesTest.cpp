@@ -28,7 +28,7 @@ std::wstring ProgramFolder() {
 // The module mapped for its resources only, as a resource editor or a caller of LoadString
 // would see it; nothing of its code runs.
 class ResourceModule {
-public:
+ public:
   ResourceModule()
       : m_module(LoadLibraryExW((ProgramFolder() + L"Lumvex1.arx").c_str(), nullptr,
                                 LOAD_LIBRARY_AS_DATAFILE | LOAD_LIBRARY_AS_IMAGE_RESOURCE)) {}
@@ -39,7 +39,7 @@ public:
   ResourceModule &operator=(const ResourceModule &) = delete;
   HMODULE get() const { return m_module; }
 
-private:
+ private:
   HMODULE m_module;
 };
 
@@ -95,13 +95,16 @@ const std::vector<Entry> kSortEntries = {{32799, L"By &Name"}, {32788, L"By &Dat
 TEST(Menus, FrameMenuOffersEveryCommandUnderItsHeading) {
   MenuHandle menu(LoadMenuW(Module(), MAKEINTRESOURCEW(128)));
   ASSERT_TRUE(menu);
-  EXPECT_EQ(Entries(menu.get()),
-            (std::vector<Entry>{{-1, L"&File"}, {-1, L"&View"}, {-1, L"&Sort"}, {-1, L"&Help"}}));
+  EXPECT_EQ(Entries(menu.get()), (std::vector<Entry>{{-1, L"&File"}, {-1, L"&View"}, {-1, L"&Sort"}, {-1, L"&Help"}}));
 
   EXPECT_EQ(Entries(GetSubMenu(menu.get(), 0)), (std::vector<Entry>{{57665, L"E&xit"}}));
-  EXPECT_EQ(Entries(GetSubMenu(menu.get(), 1)),
-            (std::vector<Entry>{{32771, L"&Begin"}, {32774, L"&Increase"}, {32775, L"&Decrease"},
-                                {32782, L"&Aligne"}, {0, L""}, {59392, L"&Toolbar"}, {59393, L"&Status Bar"}}));
+  EXPECT_EQ(Entries(GetSubMenu(menu.get(), 1)), (std::vector<Entry>{{32771, L"&Begin"},
+                                                                    {32774, L"&Increase"},
+                                                                    {32775, L"&Decrease"},
+                                                                    {32782, L"&Aligne"},
+                                                                    {0, L""},
+                                                                    {59392, L"&Toolbar"},
+                                                                    {59393, L"&Status Bar"}}));
   EXPECT_EQ(Entries(GetSubMenu(menu.get(), 2)), kSortEntries);
   EXPECT_EQ(Entries(GetSubMenu(menu.get(), 3)), (std::vector<Entry>{{57664, L"&About"}, {57670, L"&Help"}}));
 
@@ -116,8 +119,13 @@ TEST(Menus, TileMenuIsOnePopupWithFileCommandsSortAndProperty) {
   ASSERT_TRUE(menu);
   ASSERT_EQ(GetMenuItemCount(menu.get()), 1);
   HMENU popup = GetSubMenu(menu.get(), 0);
-  EXPECT_EQ(Entries(popup), (std::vector<Entry>{{32797, L"&Copy"}, {32800, L"&Delete"}, {32801, L"&Paste"},
-                                                {32802, L"&Rename"}, {0, L""}, {-1, L"&Sort"}, {0, L""},
+  EXPECT_EQ(Entries(popup), (std::vector<Entry>{{32797, L"&Copy"},
+                                                {32800, L"&Delete"},
+                                                {32801, L"&Paste"},
+                                                {32802, L"&Rename"},
+                                                {0, L""},
+                                                {-1, L"&Sort"},
+                                                {0, L""},
                                                 {32803, L"Property"}}));
   EXPECT_EQ(Entries(GetSubMenu(popup, 5)),
             (std::vector<Entry>{{32799, L"&By Name"}, {32788, L"By &Date"}, {32789, L"By &Size"}}));
@@ -141,12 +149,10 @@ TEST(Accelerators, FrameTableMapsEveryKeyToItsCommand) {
     actual.insert({a.fVirt & (FSHIFT | FCONTROL | FALT), a.key, a.cmd});
   }
   const std::set<Key> expected = {
-      {FCONTROL, 'C', 57634},      {FCONTROL, VK_INSERT, 57634}, {FCONTROL, 'V', 57637},
-      {FSHIFT, VK_INSERT, 57637},  {FCONTROL, 'X', 57635},       {FSHIFT, VK_DELETE, 57635},
-      {FCONTROL, 'A', 32793},      {0, VK_DELETE, 32794},        {0, VK_F6, 57680},
-      {FSHIFT, VK_F6, 57681},      {FCONTROL, 'O', 57601},       {FCONTROL, 'P', 57607},
-      {FCONTROL, 'N', 57600},      {FCONTROL, 'S', 57603},       {FCONTROL, 'Z', 57643},
-      {FALT, VK_BACK, 57643},
+      {FCONTROL, 'C', 57634}, {FCONTROL, VK_INSERT, 57634}, {FCONTROL, 'V', 57637}, {FSHIFT, VK_INSERT, 57637},
+      {FCONTROL, 'X', 57635}, {FSHIFT, VK_DELETE, 57635},   {FCONTROL, 'A', 32793}, {0, VK_DELETE, 32794},
+      {0, VK_F6, 57680},      {FSHIFT, VK_F6, 57681},       {FCONTROL, 'O', 57601}, {FCONTROL, 'P', 57607},
+      {FCONTROL, 'N', 57600}, {FCONTROL, 'S', 57603},       {FCONTROL, 'Z', 57643}, {FALT, VK_BACK, 57643},
   };
   EXPECT_EQ(actual, expected);
   EXPECT_EQ(entries.size(), expected.size());
@@ -181,10 +187,11 @@ TEST(Strings, PromptsToolTipsTitleAndStatusBarTexts) {
 
 // Reads a DLGTEMPLATEEX and its items; every read is checked against the resource's size.
 class TemplateReader {
-public:
+ public:
   explicit TemplateReader(std::vector<BYTE> bytes) : m_bytes(std::move(bytes)) {}
 
-  template <typename T> T Read() {
+  template <typename T>
+  T Read() {
     if (m_at + sizeof(T) > m_bytes.size()) throw std::out_of_range("template ends early");
     T value;
     std::memcpy(&value, m_bytes.data() + m_at, sizeof(T));
@@ -202,7 +209,7 @@ public:
   void AlignTo(size_t boundary) { m_at = (m_at + boundary - 1) / boundary * boundary; }
   void Skip(size_t count) { m_at += count; }
 
-private:
+ private:
   std::vector<BYTE> m_bytes;
   size_t m_at = 0;
 };
@@ -224,9 +231,8 @@ struct DialogTemplate {
 
 // The system control classes by ordinal or by name, in any case, as the dialog manager takes them.
 std::wstring ClassName(const std::wstring &name) {
-  for (const auto &[ordinal, known] : {std::pair<const wchar_t *, const wchar_t *>{L"#128", L"Button"},
-                                       {L"#129", L"Edit"},
-                                       {L"#130", L"Static"}}) {
+  for (const auto &[ordinal, known] :
+       {std::pair<const wchar_t *, const wchar_t *>{L"#128", L"Button"}, {L"#129", L"Edit"}, {L"#130", L"Static"}}) {
     if (name == ordinal || lstrcmpiW(name.c_str(), known) == 0) return known;
   }
   return name;
@@ -373,8 +379,7 @@ std::vector<WORD> ToolBarData(int id) {
 
 TEST(ToolBars, ItemsAndButtonSizesAreInTheFrameworksLayout) {
   // WORD version 1, button width, height, item count, then the ids (0 for a separator).
-  EXPECT_EQ(ToolBarData(128), (std::vector<WORD>{1, 16, 20, 11, 32771, 0, 32774, 0, 32775, 0, 32782, 0, 32804,
-                                                 32790, 32805}));
+  EXPECT_EQ(ToolBarData(128), (std::vector<WORD>{1, 16, 20, 11, 32771, 0, 32774, 0, 32775, 0, 32782, 0, 32804, 32790, 32805}));
   EXPECT_EQ(ToolBarData(204), (std::vector<WORD>{1, 80, 20, 3, 32795, 0, 32796}));
 }
 
@@ -387,8 +392,7 @@ struct Picture {
 
 Picture LoadPicture(int id) {
   Picture picture;
-  BitmapHandle bitmap(static_cast<HBITMAP>(
-      LoadImageW(Module(), MAKEINTRESOURCEW(id), IMAGE_BITMAP, 0, 0, LR_CREATEDIBSECTION)));
+  BitmapHandle bitmap(static_cast<HBITMAP>(LoadImageW(Module(), MAKEINTRESOURCEW(id), IMAGE_BITMAP, 0, 0, LR_CREATEDIBSECTION)));
   if (!bitmap) return picture;
   DIBSECTION section{};
   GetObjectW(bitmap.get(), sizeof section, &section);
@@ -462,8 +466,7 @@ void CollectChunks(const std::vector<BYTE> &riff, size_t at, size_t end,
     std::memcpy(&size, &riff[at + 4], 4);
     ASSERT_LE(at + 8 + size, end) << "chunk " << tag << " runs past its parent";
     if (tag == "LIST") {
-      chunks.emplace_back("LIST:" + std::string(reinterpret_cast<const char *>(&riff[at + 8]), 4),
-                          std::vector<BYTE>());
+      chunks.emplace_back("LIST:" + std::string(reinterpret_cast<const char *>(&riff[at + 8]), 4), std::vector<BYTE>());
       CollectChunks(riff, at + 12, at + 8 + size, chunks);
     } else {
       chunks.emplace_back(tag, std::vector<BYTE>(riff.begin() + at + 8, riff.begin() + at + 8 + size));
@@ -485,8 +488,7 @@ HICON CursorFromFrame(const std::vector<BYTE> &file) {
   std::vector<BYTE> resource(4 + size);
   std::memcpy(resource.data(), hotspot, 4);
   std::memcpy(resource.data() + 4, &file[offset], size);
-  return CreateIconFromResourceEx(resource.data(), static_cast<DWORD>(resource.size()), FALSE, 0x00030000, 32, 32,
-                                  0);
+  return CreateIconFromResourceEx(resource.data(), static_cast<DWORD>(resource.size()), FALSE, 0x00030000, 32, 32, 0);
 }
 
 // One step of a cursor drawn on white, as the tree's loading effect draws it.
@@ -541,8 +543,7 @@ TEST(LoadingCursor, IsAnAnimatedCursorOfTenHourglassFrames) {
 }
 
 TEST(LoadingCursor, LoadsAsACursorWhoseStepsShowTheSandRunning) {
-  HCURSOR cursor = static_cast<HCURSOR>(
-      LoadImageW(Module(), MAKEINTRESOURCEW(131), IMAGE_CURSOR, 0, 0, LR_DEFAULTSIZE));
+  HCURSOR cursor = static_cast<HCURSOR>(LoadImageW(Module(), MAKEINTRESOURCEW(131), IMAGE_CURSOR, 0, 0, LR_DEFAULTSIZE));
   ASSERT_TRUE(cursor);
   std::vector<std::vector<DWORD>> steps;
   for (UINT step = 0; step < 10; ++step) steps.push_back(DrawStep(cursor, step));

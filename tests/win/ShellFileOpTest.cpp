@@ -1,5 +1,6 @@
 // The shell file operation: the lists it hands the shell, its flags and title, and runs that
 // must not reach the shell.
+#include "ScratchFolder.h"
 #include "filecmd/ShellFileOp.h"
 #include "fw/WinApp.h"
 
@@ -18,29 +19,6 @@ std::string ListBytes(const CShellFileOp &operation, int which) {
 }
 
 // A folder of its own under the temporary folder, removed with everything in it.
-class ScratchFolder {
-public:
-  ScratchFolder() : m_path(fs::temp_directory_path() / ("shellop-" + std::to_string(GetTickCount64()))) {
-    fs::create_directories(m_path);
-  }
-  ~ScratchFolder() {
-    std::error_code ignored;
-    fs::remove_all(m_path, ignored);
-  }
-  std::string File(const char *name, const char *content = nullptr) const {
-    const fs::path file = m_path / name;
-    if (content) std::ofstream(file, std::ios::binary) << content;
-    return file.string();
-  }
-
-private:
-  fs::path m_path;
-};
-
-std::string Content(const std::string &path) {
-  std::ifstream in(path, std::ios::binary);
-  return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
-}
 
 TEST(ShellFileOp, EachPathGrowsTheListByExactlyWhatItNeeds) {
   CShellFileOp operation;
@@ -108,7 +86,7 @@ TEST(ShellFileOp, DeleteRunsWithAllowUndoAloneWhateverWasSet) {
 }
 
 TEST(ShellFileOp, ListShortOfAPathNeverReachesTheShell) {
-  ScratchFolder folder;
+  ScratchFolder folder("shellop");
   const std::string source = folder.File("a.txt", "alpha");
   const std::string target = folder.File("copy.txt");
   CShellFileOp operation;
@@ -127,7 +105,7 @@ TEST(ShellFileOp, ListShortOfAPathNeverReachesTheShell) {
 }
 
 TEST(ShellFileOp, OneCallFormRunsAtOnce) {
-  ScratchFolder folder;
+  ScratchFolder folder("shellop");
   const std::string from = folder.File("plan.dwg", "plan");
   const std::string to = folder.File("plan2.dwg");
   {
