@@ -394,3 +394,59 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
   RemoveDirectoryA(source.c_str());
 }
 }  // namespace
+
+namespace {
+constexpr int kHelp = 0xE146;
+
+std::string StatusText(HWND frame) {
+  char text[128] = "";
+  SendMessageA(FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr), SB_GETTEXTA, 0, reinterpret_cast<LPARAM>(text));
+  return text;
+}
+
+TEST_F(ExplorerFrame, MenuPromptsShowInTheStatusBarAndReadyComesBack) {
+  std::string prompt, separator, ready;
+  Browse(BrowseArgs(L""), [&](HWND frame) {
+    HMENU sort = GetSubMenu(GetMenu(frame), 2);
+    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(kSortByName, MF_STRING), reinterpret_cast<LPARAM>(sort));
+    prompt = StatusText(frame);
+    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(0, MF_POPUP), reinterpret_cast<LPARAM>(GetMenu(frame)));
+    separator = StatusText(frame);
+    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(0, 0xFFFF), 0);
+    ready = StatusText(frame);
+    Command(frame, kCancel);
+  });
+  EXPECT_EQ(prompt, "Sort by name");
+  EXPECT_EQ(separator, "");
+  EXPECT_EQ(ready, "Ready");
+}
+
+TEST_F(ExplorerFrame, FrameAcceleratorsWorkInsideTheModalLoop) {
+  HWND focus = nullptr, rightPane = nullptr;
+  Browse(BrowseArgs(L""), [&](HWND frame) {
+    HWND splitter = GetDlgItem(frame, 0xE900);
+    rightPane = GetDlgItem(splitter, 0xE901);
+    // F6 is the frame's accelerator for the next pane: a key for the left pane goes up from it
+    // to the frame, whose table turns it into the command that moves the focus on.
+    PostMessageA(GetDlgItem(splitter, 0xE900), WM_KEYDOWN, VK_F6, 0);
+    // Posted input is taken after sent messages: wait until the key has been handled.
+    for (int waited = 0; waited < 3000 && focus != rightPane; waited += 20) {
+      Sleep(20);
+      GUITHREADINFO info{};
+      info.cbSize = sizeof info;
+      GetGUIThreadInfo(GetWindowThreadProcessId(frame, nullptr), &info);
+      focus = info.hwndFocus;
+    }
+    Command(frame, kCancel);
+  });
+  EXPECT_EQ(focus, rightPane);
+}
+
+TEST_F(ExplorerFrame, HelpWithoutAHelpFileChangesNothing) {
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    SendMessageA(frame, WM_COMMAND, kHelp, 0);
+    Command(frame, kCancel);
+  });
+  EXPECT_EQ(outcome.resultKind, RTNIL);
+}
+}  // namespace
