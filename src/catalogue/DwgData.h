@@ -13,6 +13,9 @@ class DwgData {
       : m_strDwgName(std::move(lowerName)), m_tLastWrite(lastWrite), m_nFileSize(fileSize) {}
   DwgData(const DwgData &) = default;
   DwgData &operator=(const DwgData &) = default;
+  // Moving keeps the growth of a large catalogue from copying every name again.
+  DwgData(DwgData &&) noexcept = default;
+  DwgData &operator=(DwgData &&) noexcept = default;
   virtual ~DwgData() = default;
 
   bool IsSelected() const { return m_bSelected != 0; }
