@@ -1,11 +1,14 @@
 #include "explorer/DialogRun.h"
 
+#include "explorer/MainFrame.h"
 #include "explorer/MdiMixin.h"
 #include "res/resource.h"
 
 namespace {
 constexpr UINT kDoubleClickMilliseconds = 300;
-}
+// Sent to itself once the modal loop has shown the (invisible) dialog.
+constexpr UINT kActivateExplorer = WM_APP + 1;
+}  // namespace
 
 CDialogRun::CDialogRun() : CDialog(IDD_DIALOG_RUN) {}
 
@@ -27,4 +30,19 @@ BOOL CDialogRun::OnInitDialog() {
 BOOL CDialogRun::PreTranslateMessage(MSG *msg) {
   if (msg->message == WM_APP) EndDialog(static_cast<int>(msg->wParam));
   return CDialog::PreTranslateMessage(msg);
+}
+
+LRESULT CDialogRun::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+  switch (message) {
+    case WM_SHOWWINDOW:
+      // Showing the dialog would leave the keyboard with an invisible window: the explorer
+      // takes the activation back as soon as the show is done.
+      if (wParam) PostMessage(kActivateExplorer);
+      break;
+    case kActivateExplorer:
+      if (g_pMainFrame && g_pMainFrame->m_hWnd) ::SetActiveWindow(g_pMainFrame->m_hWnd);
+      return 0;
+    default: break;
+  }
+  return CDialog::WindowProc(message, wParam, lParam);
 }

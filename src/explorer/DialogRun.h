@@ -11,4 +11,5 @@ class CDialogRun : public fw::CDialog {
 
   BOOL OnInitDialog() override;
   BOOL PreTranslateMessage(MSG *msg) override;
+  LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 };

@@ -439,7 +439,9 @@ TEST_F(ExplorerFrame, FrameAcceleratorsWorkInsideTheModalLoop) {
     }
     Command(frame, kCancel);
   });
-  EXPECT_EQ(focus, rightPane);
+  char focusClass[64] = "";
+  GetClassNameA(focus, focusClass, sizeof focusClass);
+  EXPECT_EQ(focus, rightPane) << "focus on a " << focusClass << " id " << GetDlgCtrlID(focus);
 }
 
 TEST_F(ExplorerFrame, HelpWithoutAHelpFileChangesNothing) {
