@@ -6,7 +6,7 @@
 #include "fw/CmdUI.h"
 #include "fw/WinApp.h"
 #include "host/ModuleGlobals.h"
-#include "host/ShellPathCompose.h"
+#include "host/SplitPath.h"
 #include "res/resource.h"
 #include "settings/IniFile.h"
 #include "thumbs/FocusedEdit.h"
@@ -187,11 +187,8 @@ void CMainFrame::SetSearchText(const std::string &text) {
 void CMainFrame::OpenHelp() const {
   char modulePath[MAX_PATH] = "";
   GetModuleFileNameA(g_hModule, modulePath, MAX_PATH);
-  std::string helpPath = modulePath;
-  const size_t dot = helpPath.find_last_of('.');
-  const size_t separator = helpPath.find_last_of("\\/");
-  if (dot != std::string::npos && (separator == std::string::npos || dot > separator)) helpPath.erase(dot);
-  helpPath += ".hlp";
+  const PathParts parts = SplitPath(modulePath);
+  const std::string helpPath = parts.drive + parts.directory + parts.baseName + ".hlp";
   ShellExecuteA(m_hWnd, "open", helpPath.c_str(), nullptr, nullptr, SW_SHOWMAXIMIZED);
 }
 

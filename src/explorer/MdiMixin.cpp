@@ -6,7 +6,7 @@
 #include "fw/Dialog.h"
 #include "fw/FrameWnd.h"
 #include "host/HostApi.h"
-#include "host/ShellPathCompose.h"
+#include "host/SplitPath.h"
 
 bool CMdiMixin::SetFrameResource(UINT resourceId) {
   m_nFrameResource = resourceId;
@@ -39,7 +39,7 @@ bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
   }
   frame->UpdateWindow();
   frame->EnableAccept(false);
-  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(FileBaseName(g_pDoc->m_strName));
+  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(SplitPath(g_pDoc->m_strName).baseName);
   g_pDoc->m_strName.clear();
   return true;
 }

@@ -4,17 +4,6 @@
 
 #include <string>
 
-struct FolderPathParts {
-  std::string drive;      // "C:" or empty
-  std::string directory;  // everything after the drive up to and including the last separator
-};
-
-// Splits as _splitpath does; the file name and extension are dropped.
-FolderPathParts SplitFolderPath(const std::string &path);
-
-// The file name without folder and extension, as _splitpath gives it ("plan" of "plan.dwg").
-std::string FileBaseName(const std::string &path);
-
 struct ShellFolderNames {
   std::string desktop;
   std::string drives;

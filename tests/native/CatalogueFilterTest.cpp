@@ -1,6 +1,7 @@
 // The scan's choice of entries and the place of the explorer state file.
 #include "catalogue/ScanFilter.h"
 #include "catalogue/StateFilePath.h"
+#include "host/SplitPath.h"
 
 #include <gtest/gtest.h>
 

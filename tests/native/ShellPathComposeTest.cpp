@@ -1,5 +1,6 @@
 // The start folder's shell path: splitting as _splitpath does, and joining the tree's labels.
 #include "host/ShellPathCompose.h"
+#include "host/SplitPath.h"
 
 #include <gtest/gtest.h>
 
@@ -7,29 +8,29 @@ namespace {
 const ShellFolderNames kNames{"Desktop", "My Computer", "My Network Places"};
 
 std::string Compose(const std::string &folder, const std::string &driveDisplayName) {
-  return ComposeStartShellPath(kNames, driveDisplayName, SplitFolderPath(folder).directory);
+  return ComposeStartShellPath(kNames, driveDisplayName, SplitPath(folder).directory);
 }
 
-TEST(SplitFolderPath, KeepsDriveAndDirectoryAndDropsTheFileName) {
-  EXPECT_EQ(SplitFolderPath("C:\\Proj\\").drive, "C:");
-  EXPECT_EQ(SplitFolderPath("C:\\Proj\\").directory, "\\Proj\\");
-  EXPECT_EQ(SplitFolderPath("C:\\Proj").directory, "\\") << "Proj without a separator is a file name";
-  EXPECT_EQ(SplitFolderPath("C:\\Proj\\plan.dwg").directory, "\\Proj\\");
-  EXPECT_EQ(SplitFolderPath("c:relative\\x.dwg").directory, "relative\\");
-  EXPECT_EQ(SplitFolderPath("C:").directory, "");
-  EXPECT_EQ(SplitFolderPath("C:/mixed/seps/a.dwg").directory, "/mixed/seps/");
+TEST(SplitPath, KeepsDriveAndDirectoryAndDropsTheFileName) {
+  EXPECT_EQ(SplitPath("C:\\Proj\\").drive, "C:");
+  EXPECT_EQ(SplitPath("C:\\Proj\\").directory, "\\Proj\\");
+  EXPECT_EQ(SplitPath("C:\\Proj").directory, "\\") << "Proj without a separator is a file name";
+  EXPECT_EQ(SplitPath("C:\\Proj\\plan.dwg").directory, "\\Proj\\");
+  EXPECT_EQ(SplitPath("c:relative\\x.dwg").directory, "relative\\");
+  EXPECT_EQ(SplitPath("C:").directory, "");
+  EXPECT_EQ(SplitPath("C:/mixed/seps/a.dwg").directory, "/mixed/seps/");
 }
 
-TEST(SplitFolderPath, UncPathHasNoDrive) {
-  const FolderPathParts parts = SplitFolderPath("\\\\server\\share\\dwg\\");
+TEST(SplitPath, UncPathHasNoDrive) {
+  const PathParts parts = SplitPath("\\\\server\\share\\dwg\\");
   EXPECT_EQ(parts.drive, "");
   EXPECT_EQ(parts.directory, "\\\\server\\share\\dwg\\");
 }
 
-TEST(SplitFolderPath, BareNamesAndEmptyText) {
-  EXPECT_EQ(SplitFolderPath("plan.dwg").directory, "");
-  EXPECT_EQ(SplitFolderPath("").drive, "");
-  EXPECT_EQ(SplitFolderPath("x").drive, "");
+TEST(SplitPath, BareNamesAndEmptyText) {
+  EXPECT_EQ(SplitPath("plan.dwg").directory, "");
+  EXPECT_EQ(SplitPath("").drive, "");
+  EXPECT_EQ(SplitPath("x").drive, "");
 }
 
 TEST(ComposeStartShellPath, DriveFoldersGoThroughTheDrivesFolder) {
@@ -44,12 +45,12 @@ TEST(ComposeStartShellPath, PathsWithoutDriveGoThroughTheNetworkFolder) {
 }  // namespace
 
 namespace {
-TEST(FileBaseName, DropsFolderAndLastExtension) {
-  EXPECT_EQ(FileBaseName("plan.dwg"), "plan");
-  EXPECT_EQ(FileBaseName("C:\\Proj\\plan.dwg"), "plan");
-  EXPECT_EQ(FileBaseName("plan.dwg.old"), "plan.dwg");
-  EXPECT_EQ(FileBaseName("noext"), "noext");
-  EXPECT_EQ(FileBaseName(".dwg"), "");
-  EXPECT_EQ(FileBaseName("c:x.dwg"), "x");
+TEST(SplitPath, BaseNameDropsFolderAndLastExtension) {
+  EXPECT_EQ(SplitPath("plan.dwg").baseName, "plan");
+  EXPECT_EQ(SplitPath("C:\\Proj\\plan.dwg").baseName, "plan");
+  EXPECT_EQ(SplitPath("plan.dwg.old").baseName, "plan.dwg");
+  EXPECT_EQ(SplitPath("noext").baseName, "noext");
+  EXPECT_EQ(SplitPath(".dwg").baseName, "");
+  EXPECT_EQ(SplitPath("c:x.dwg").baseName, "x");
 }
 }  // namespace
