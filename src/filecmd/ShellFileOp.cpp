@@ -81,19 +81,7 @@ void CShellFileOp::SetTitle(const char *text) {
   m_op.lpszProgressTitle = m_pTitle;
 }
 
-void CShellFileOp::SetTitle(UINT stringId) {
-  // A string resource holds at most 65535 characters; grow until the text fits.
-  std::string text(256, '\0');
-  for (;;) {
-    const int length = LoadStringA(fw::AfxGetResourceHandle(), stringId, text.data(), static_cast<int>(text.size()));
-    if (length < static_cast<int>(text.size()) - 1 || text.size() > 65536) {
-      text.resize(length > 0 ? static_cast<size_t>(length) : 0);
-      break;
-    }
-    text.resize(text.size() * 2);
-  }
-  SetTitle(text.c_str());
-}
+void CShellFileOp::SetTitle(UINT stringId) { SetTitle(fw::AfxLoadString(stringId).c_str()); }
 
 int CShellFileOp::Run(UINT function) {
   m_op.fAnyOperationsAborted = FALSE;

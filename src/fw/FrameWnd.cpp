@@ -33,13 +33,6 @@ LPCSTR FrameClassName(UINT resourceId, HINSTANCE resources) {
 std::string FirstPart(const std::string &text) { return text.substr(0, text.find('\n')); }
 }  // namespace
 
-std::string AfxLoadString(UINT id) {
-  std::string text(4096, '\0');  // a string resource holds at most 4095 characters
-  const int copied = LoadStringA(AfxGetResourceHandle(), id, text.data(), static_cast<int>(text.size()));
-  text.resize(static_cast<size_t>(copied > 0 ? copied : 0));
-  return text;
-}
-
 BOOL CFrameWnd::PreCreateWindow(CREATESTRUCTA &) { return TRUE; }
 
 BOOL CFrameWnd::LoadFrame(UINT resourceId, DWORD style, CWnd *owner) {

@@ -5,6 +5,7 @@
 
 #include "fw/ControlBar.h"
 #include "fw/FrameworkIds.h"
+#include "fw/WinApp.h"
 #include "fw/Wnd.h"
 
 #include <string>
@@ -77,8 +78,5 @@ class CFrameWnd : public CWnd {
   DWORD m_dwDockSides = 0;
   bool m_bPromptShown = false;
 };
-
-// Loads a string of the current resource module; empty when there is none.
-std::string AfxLoadString(UINT id);
 
 }  // namespace fw

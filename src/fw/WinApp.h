@@ -3,6 +3,8 @@
 
 #include <windows.h>
 
+#include <string>
+
 namespace fw {
 
 class CWnd;
@@ -26,6 +28,9 @@ CWinApp *AfxGetApp();
 // The module whose dialogs, menus and strings are loaded.
 HINSTANCE AfxGetResourceHandle();
 void AfxSetResourceHandle(HINSTANCE instance);
+// A string of the current resource module in ANSI text, whatever its length; empty when there
+// is none.
+std::string AfxLoadString(UINT id);
 
 // Makes this module's resources current for the lifetime of the scope, restoring the previous
 // ones after: a host calls into several modules on one thread.

@@ -1,6 +1,7 @@
 // The explorer frame of a browse call, on real windows: layout, commands, check marks, how the
 // browse ends and what it leaves in the state file.
 #include "ExplorerHarness.h"
+#include "ScratchFolder.h"
 
 #include <gtest/gtest.h>
 #include <shlobj.h>
@@ -183,12 +184,9 @@ TEST_F(ExplorerFrame, PlacementDefaultMovedOrMaximised) {
 }
 
 TEST_F(ExplorerFrame, AcceptReturnsThePathWithTheFolderSettings) {
-  char temp[MAX_PATH];
-  GetTempPathA(MAX_PATH, temp);
-  const std::string folder = std::string(temp) + "lumvex-accept";
-  CreateDirectoryA(folder.c_str(), nullptr);
-  std::ofstream(folder + "\\datains.ini", std::ios::binary)
-      << "[Default Parameters]\r\nLayer=WALLS\r\nLisp command=MYCMD\r\nColor=1\r\n\r\n";
+  ScratchFolder scratch("lumvex-accept");
+  const std::string folder = scratch.Path();
+  scratch.File("datains.ini", "[Default Parameters]\r\nLayer=WALLS\r\nLisp command=MYCMD\r\nColor=1\r\n\r\n");
   m_state.Write(StateFile(0, 0, 0, folder, "plan.dwg"));
   std::string searchText;
   const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
@@ -207,8 +205,6 @@ TEST_F(ExplorerFrame, AcceptReturnsThePathWithTheFolderSettings) {
   const std::string ini = m_state.Read();
   EXPECT_EQ(IniValue(ini, "Name"), "") << "the remembered name is emptied";
   EXPECT_EQ(IniValue(ini, "Path"), folder + "\\");
-  DeleteFileA((folder + "\\datains.ini").c_str());
-  RemoveDirectoryA(folder.c_str());
 }
 
 TEST_F(ExplorerFrame, AcceptWithoutFolderSettingsGivesThreeEmptyTexts) {
@@ -250,14 +246,6 @@ constexpr int kViewStatusBar = 0xE801;
 constexpr int kEditCopy = 0xE122;
 constexpr int kEditCut = 0xE123;
 constexpr int kEditPaste = 0xE125;
-
-std::string TempFolder(const std::string &name) {
-  char temp[MAX_PATH];
-  GetTempPathA(MAX_PATH, temp);
-  const std::string folder = std::string(temp) + name;
-  CreateDirectoryA(folder.c_str(), nullptr);
-  return folder;
-}
 
 void PutFileListOnClipboard(const std::string &path) {
   const size_t bytes = sizeof(DROPFILES) + path.size() + 2;
@@ -360,8 +348,8 @@ TEST_F(ExplorerFrame, CutLeavesTheClipboardAlone) {
 }
 
 TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheLabel) {
-  const std::string source = TempFolder("lumvex-paste-source");
-  std::ofstream(source + "\\door.dwg", std::ios::binary) << "AC1018";
+  ScratchFolder source("lumvex-paste-source");
+  const std::string drawing = source.File("door.dwg", "AC1018");
   struct Case {
     const char *settings;  // nullptr: no datains.ini
     const char *label;
@@ -369,11 +357,12 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
   for (const Case &c :
        {Case{nullptr, " Layer name: Current"}, Case{"[Default Parameters]\r\nLayer=\r\nColor=3\r\n", " Layer name: Current"},
         Case{"[Default Parameters]\r\nLayer=WALLS\r\n", " Layer name: WALLS"}}) {
-    const std::string folder = TempFolder("lumvex-paste-target");
-    if (c.settings) std::ofstream(folder + "\\datains.ini", std::ios::binary) << c.settings;
+    ScratchFolder target("lumvex-paste-target");
+    const std::string folder = target.Path();
+    if (c.settings) target.File("datains.ini", c.settings);
     m_state.Write(StateFile(0, 0, 0, folder));
     SetCurrentDirectoryA(folder.c_str());
-    PutFileListOnClipboard(source + "\\door.dwg");
+    PutFileListOnClipboard(drawing);
     std::string label, title;
     Browse(BrowseArgs(L""), [&](HWND frame) {
       SendMessageA(frame, WM_COMMAND, kEditPaste, 0);
@@ -386,12 +375,7 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
     EXPECT_EQ(label, c.label);
     EXPECT_EQ(title, folder);
     EXPECT_NE(GetFileAttributesA((folder + "\\door.dwg").c_str()), INVALID_FILE_ATTRIBUTES) << "the drawing was pasted";
-    DeleteFileA((folder + "\\door.dwg").c_str());
-    DeleteFileA((folder + "\\datains.ini").c_str());
-    RemoveDirectoryA(folder.c_str());
   }
-  DeleteFileA((source + "\\door.dwg").c_str());
-  RemoveDirectoryA(source.c_str());
 }
 }  // namespace
 

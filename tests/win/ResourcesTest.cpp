@@ -1,5 +1,6 @@
 // The module's resources as its callers load them: menus, accelerators, strings, dialog
 // templates, tool bars with their pictures, icons and the animated loading cursor.
+#include "ModuleHarness.h"
 #include "res/resource.h"
 
 #include <windows.h>
@@ -17,13 +18,6 @@
 #include <vector>
 
 namespace {
-
-std::wstring ProgramFolder() {
-  wchar_t path[MAX_PATH] = L"";
-  const DWORD length = GetModuleFileNameW(nullptr, path, MAX_PATH);
-  std::wstring folder(path, length);
-  return folder.substr(0, folder.find_last_of(L"\\/") + 1);
-}
 
 // The module mapped for its resources only, as a resource editor or a caller of LoadString
 // would see it; nothing of its code runs.
