@@ -13,6 +13,8 @@ HostOptions ParseOptions(const std::vector<std::wstring> &args) {
       options.evals.push_back(args[++i]);
     } else if (arg == L"--module" && hasValue) {
       options.modulePath = args[++i];
+    } else if (arg == L"--layers" && hasValue) {
+      options.layers = args[++i];
     } else if (arg == L"--drawings" && hasValue) {
       wchar_t *end = nullptr;
       const long count = std::wcstol(args[++i].c_str(), &end, 10);

@@ -9,6 +9,7 @@ struct HostOptions {
   std::vector<std::wstring> evals;
   std::wstring modulePath;  // empty: Lumvex1.arx beside the program
   int drawings = 1;
+  std::wstring layers;  // layer table of every drawing, "0=7;WALLS=1"; empty: layer "0" in colour 7
   std::wstring error;  // non-empty when the command line could not be read
 };
 

@@ -81,8 +81,10 @@ int main() {
   _setmode(_fileno(stderr), _O_BINARY);
   const HostOptions options = ParseOptions(CommandLineArguments());
   if (!options.error.empty()) {
-    std::fprintf(stderr, "devhost: %ls\nusage: devhost [--batch] [--eval EXPR]... [--module PATH] [--drawings N]\n",
-                 options.error.c_str());
+    std::fprintf(
+        stderr,
+        "devhost: %ls\nusage: devhost [--batch] [--eval EXPR]... [--module PATH] [--drawings N] [--layers NAME=COLOUR;...]\n",
+        options.error.c_str());
     return kExitBadOptions;
   }
 
@@ -107,7 +109,13 @@ int main() {
       [] { devhostUnloadModule(); });
   if (hasWindow) devhostSetWindows(window.Frame(), window.DrawingView());
 
-  for (int i = 0; i < options.drawings; ++i) devhostOpenDrawing();
+  for (int i = 0; i < options.drawings; ++i) {
+    devhostOpenDrawing();
+    if (!options.layers.empty() && !devhostSetLayers(options.layers.c_str())) {
+      std::fprintf(stderr, "devhost: --layers takes NAME=COLOUR;... with colours from 1 to 255\n");
+      return kExitBadOptions;
+    }
+  }
   const std::wstring modulePath = options.modulePath.empty() ? DefaultModulePath() : options.modulePath;
   const int loaded = devhostLoadModule(modulePath.c_str());
   if (loaded != kDevhostLoaded) {

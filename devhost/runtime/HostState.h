@@ -26,9 +26,25 @@ struct DefinedFunction {
   int code;
 };
 
+// One layer of a drawing's layer table.
+class LayerRecord final : public AcDbLayerTableRecord {
+ public:
+  LayerRecord(std::wstring layerName, short colorIndex) : name(std::move(layerName)), index(colorIndex) {}
+  const ACHAR *className() const override;
+  Acad::ErrorStatus close() override { return Acad::eOk; }
+  AcCmColor color() const override { return AcCmColor(index); }
+
+  std::wstring name;
+  short index;
+};
+
+// A new drawing's layer table: layer "0" in colour 7.
+std::vector<std::unique_ptr<LayerRecord>> DefaultLayers();
+
 struct Drawing {
   std::unique_ptr<AcApDocument> document;
   std::vector<DefinedFunction> functions;
+  std::vector<std::unique_ptr<LayerRecord>> layers = DefaultLayers();
 };
 
 using EntryPointFunction = int (*)(int message, void *appId);

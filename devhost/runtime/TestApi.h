@@ -60,6 +60,10 @@ typedef void (*DevhostOutputSink)(const wchar_t *text, void *context);
 DEVHOST_API void devhostSetOutputSink(DevhostOutputSink sink, void *context);
 DEVHOST_API void devhostSetBatchMode(bool batch);
 
+// The current drawing's layer table, from "NAME=COLOUR;NAME=COLOUR..." (colours 1 to 255);
+// false, with the table unchanged, when the text is malformed or no drawing is open.
+DEVHOST_API bool devhostSetLayers(const wchar_t *spec);
+
 // The host's windows, as the module asks for them.
 DEVHOST_API void devhostSetWindows(void *mainFrame, void *drawingView);
 }

@@ -1,11 +1,14 @@
 #include "explorer/LeftView.h"
 
-#include "catalogue/FolderScan.h"
 #include "catalogue/Ombra3Doc.h"
-#include "fw/WinApp.h"
-#include "thumbs/Ombra3View.h"
+#include "fw/FrameworkIds.h"
+#include "host/ModuleGlobals.h"
 
 CLeftView *g_pLeftView = nullptr;
+
+namespace {
+constexpr DWORD kTreeStyle = WS_CHILD | WS_VISIBLE | TVS_HASBUTTONS | TVS_HASLINES | TVS_LINESATROOT;
+}  // namespace
 
 CLeftView::CLeftView() { g_pLeftView = this; }
 
@@ -13,16 +16,31 @@ CLeftView::~CLeftView() {
   if (g_pLeftView == this) g_pLeftView = nullptr;
 }
 
-void CLeftView::RefreshSelectedFolder() {
-  if (!g_pDoc || g_pDoc->m_strPath.empty()) return;
-  ScanFolder(g_pDoc->m_strPath, ".dwg");
-  if (g_pThumbView) g_pThumbView->ReloadFolder();
+BOOL CLeftView::Create(LPCSTR className, LPCSTR windowName, DWORD style, const RECT &rect, fw::CWnd *parent, UINT id) {
+  const BOOL created = CView::Create(className, windowName, style, rect, parent, id);
+  if (!created) return FALSE;
+  if (!m_wndTree.Create(kTreeStyle, RECT{0, 0, 0, 0}, this, AFX_IDW_PANE_FIRST)) return FALSE;
+  m_wndTree.InsertRootItem();
+  if (g_pDoc) {
+    if (g_szStartShellPath[0]) g_pDoc->m_strShellPath = g_szStartShellPath;
+    m_wndTree.ExpandToPath(g_pDoc->m_strShellPath);
+  }
+  return created;
 }
 
 LRESULT CLeftView::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
-  if (message == WM_KEYDOWN && wParam == VK_ESCAPE) {
-    if (fw::CWinApp *app = fw::AfxGetApp(); app && app->m_pMainWnd) app->m_pMainWnd->PostMessage(WM_APP, 2);
-    return 0;
+  switch (message) {
+    case WM_SETFOCUS: {
+      const LRESULT result = CView::WindowProc(message, wParam, lParam);
+      if (m_wndTree.m_hWnd) m_wndTree.SetFocus();
+      return result;
+    }
+    case WM_SIZE: {
+      const LRESULT result = CView::WindowProc(message, wParam, lParam);
+      if (m_wndTree.m_hWnd)
+        ::SetWindowPos(m_wndTree.m_hWnd, nullptr, 0, 0, LOWORD(lParam), HIWORD(lParam), SWP_NOMOVE | SWP_NOZORDER);
+      return result;
+    }
+    default: return CView::WindowProc(message, wParam, lParam);
   }
-  return CView::WindowProc(message, wParam, lParam);
 }

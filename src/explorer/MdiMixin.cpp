@@ -2,11 +2,13 @@
 
 #include "catalogue/Ombra3Doc.h"
 #include "explorer/FramePlacement.h"
+#include "explorer/LeftView.h"
 #include "explorer/MainFrame.h"
 #include "fw/Dialog.h"
 #include "fw/FrameWnd.h"
 #include "host/HostApi.h"
 #include "host/SplitPath.h"
+#include "thumbs/Ombra3View.h"
 
 bool CMdiMixin::SetFrameResource(UINT resourceId) {
   m_nFrameResource = resourceId;
@@ -29,6 +31,18 @@ bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
   dialog->GetWindowRect(&dialogRect);
   const FramePlacement placement = PlaceFrame({dialogRect.left, dialogRect.top, dialogRect.right, dialogRect.bottom},
                                               g_pDoc->m_nWindowWidth, g_pDoc->m_nWindowHeight);
+
+  // The start item becomes the first visible, the highlighted and the selected item: the
+  // selection scans its folder and the view shows it.
+  if (g_pThumbView && g_pLeftView) {
+    CChildView &tree = g_pLeftView->GetTreeCtrl();
+    if (HTREEITEM start = tree.GetStartItem()) {
+      tree.Select(start, TVGN_FIRSTVISIBLE);
+      tree.Select(start, TVGN_DROPHILITE);
+      tree.Select(start, TVGN_CARET);
+      tree.SetFocus();
+    }
+  }
 
   if (placement.maximized) {
     frame->ShowWindow(SW_SHOWMAXIMIZED);

@@ -120,6 +120,74 @@ class CWinAppHost {
   virtual void *mainWindow() const = 0;
 };
 
+// The drawing database, as far as the layer lookups go: the working database's layer table,
+// a layer's record and its colour. Objects are opened for reading and closed by the caller.
+namespace Acad {
+enum ErrorStatus : int { eOk = 0, eKeyNotFound = 81, eNotThatKindOfClass = 120, eNullObjectId = 5 };
+}
+namespace AcDb {
+enum OpenMode : int { kForRead = 0, kForWrite = 1, kForNotify = 2 };
+}
+
+class AcDbObjectId {
+ public:
+  AcDbObjectId() = default;
+  explicit AcDbObjectId(const void *stub) : m_stub(stub) {}
+  bool isNull() const { return m_stub == nullptr; }
+  const void *stub() const { return m_stub; }
+
+ private:
+  const void *m_stub = nullptr;
+};
+
+class AcCmColor {
+ public:
+  explicit AcCmColor(short index = 256) : m_index(index) {}
+  short colorIndex() const { return m_index; }
+
+ private:
+  short m_index;
+};
+
+class AcDbObject : public AcRxObject {
+ public:
+  virtual Acad::ErrorStatus close() = 0;
+};
+
+class AcDbLayerTableRecord : public AcDbObject {
+ public:
+  static constexpr const ACHAR *kClassName = L"AcDbLayerTableRecord";
+  virtual AcCmColor color() const = 0;
+  static AcDbLayerTableRecord *cast(AcRxObject *object) {
+    return IsNamed(object, kClassName) ? static_cast<AcDbLayerTableRecord *>(object) : nullptr;
+  }
+
+ private:
+  static bool IsNamed(const AcRxObject *object, const ACHAR *expected) {
+    if (!object) return false;
+    const ACHAR *name = object->className();
+    while (*name && *name == *expected) ++name, ++expected;
+    return *name == *expected;
+  }
+};
+
+class AcDbLayerTable : public AcDbObject {
+ public:
+  virtual Acad::ErrorStatus getIdAt(const ACHAR *name, AcDbObjectId &id, bool getErased = false) const = 0;
+};
+
+class AcDbDatabase {
+ public:
+  virtual ~AcDbDatabase() = default;
+  virtual Acad::ErrorStatus getSymbolTable(AcDbLayerTable *&table, AcDb::OpenMode mode) = 0;
+};
+
+class AcDbHostApplicationServices {
+ public:
+  virtual ~AcDbHostApplicationServices() = default;
+  virtual AcDbDatabase *workingDatabase() const = 0;
+};
+
 #ifdef _WIN32
 #define LUMVEX_HOST_API __declspec(dllimport)
 #else
@@ -162,6 +230,17 @@ LUMVEX_HOST_DECL void acdbFail(const ACHAR *message);
 LUMVEX_HOST_DECL void *acedGetAcadFrame();
 LUMVEX_HOST_DECL CWinAppHost *acedGetAcadWinApp();
 LUMVEX_HOST_DECL void *acedGetAcadDwgView();
+
+// Colours: the host's index colours (ACI 1 to 255) and its colour dialog. acedGetRGB gives the
+// colour as a Windows colour value (red in the low byte); acedSetColorDialog shows the dialog on
+// `color` and, when the user accepts, writes the chosen index back and returns true.
+LUMVEX_HOST_DECL uint32_t acedGetRGB(int color);
+LUMVEX_HOST_DECL bool acedSetColorDialog(int &color, bool allowMetaColor, int currentLayerColor);
+
+// The drawing database.
+LUMVEX_HOST_DECL AcDbHostApplicationServices *acdbHostApplicationServices();
+// Opens the object of `id`; the caller closes it.
+LUMVEX_HOST_DECL Acad::ErrorStatus acdbOpenObject(AcDbObject *&object, AcDbObjectId id, AcDb::OpenMode mode);
 
 // Drawing previews.
 LUMVEX_HOST_DECL bool acdbDisplayPreviewFromDwg(const ACHAR *path, void *window, const uint32_t *background);

@@ -1,0 +1,224 @@
+#include "explorer/ShellTreeCtrl.h"
+
+#include "catalogue/Ombra3Doc.h"
+#include "explorer/MainFrame.h"
+#include "explorer/ShellString.h"
+#include "fw/Menu.h"
+#include "settings/DialogSetLa.h"
+#include "thumbs/Ombra3View.h"
+
+#include <shellapi.h>
+
+#include <cstring>
+
+namespace {
+constexpr UINT kFolderSettingsCommand = 1;
+constexpr size_t kTextCapacity = 260;
+
+HIMAGELIST SystemSmallIcons() {
+  const CShellPidl desktop([] {
+    LPITEMIDLIST list = nullptr;
+    SHGetSpecialFolderLocation(nullptr, CSIDL_DESKTOP, &list);
+    return list;
+  }());
+  SHFILEINFOA info{};
+  return reinterpret_cast<HIMAGELIST>(SHGetFileInfoA(reinterpret_cast<LPCSTR>(desktop.Get()), 0, &info, sizeof info,
+                                                     SHGFI_PIDL | SHGFI_SYSICONINDEX | SHGFI_SMALLICON));
+}
+
+int SystemIconIndex(LPCITEMIDLIST absolute, UINT extra) {
+  SHFILEINFOA info{};
+  SHGetFileInfoA(reinterpret_cast<LPCSTR>(absolute), 0, &info, sizeof info,
+                 SHGFI_PIDL | SHGFI_SYSICONINDEX | SHGFI_SMALLICON | extra);
+  return info.iIcon;
+}
+
+ULONG Attributes(const ShellItemData &data, ULONG wanted) {
+  LPCITEMIDLIST child = data.ChildId();
+  ULONG attributes = wanted;
+  if (!data.pParentFolder || FAILED(data.pParentFolder->GetAttributesOf(1, &child, &attributes))) return 0;
+  return attributes;
+}
+
+int CALLBACK CompareItems(LPARAM first, LPARAM second, LPARAM) {
+  return CShellTreeCtrl::CompareSiblings(*reinterpret_cast<const ShellItemData *>(first),
+                                         *reinterpret_cast<const ShellItemData *>(second));
+}
+
+bool FolderPath(const ShellItemData *data, char (&path)[MAX_PATH]) {
+  return data && SHGetPathFromIDListA(data->pidl.Get(), path);
+}
+}  // namespace
+
+CShellTreeCtrl::~CShellTreeCtrl() {
+  // The records go with their items while this object still knows how to free them.
+  if (m_hWnd) DestroyWindow();
+}
+
+BOOL CShellTreeCtrl::Create(DWORD style, const RECT &rect, fw::CWnd *parent, UINT id) {
+  if (!CTreeCtrl::Create(style, rect, parent, id)) return FALSE;
+  SetImageList(SystemSmallIcons(), TVSIL_NORMAL);
+  return TRUE;
+}
+
+void CShellTreeCtrl::InsertRootItem() {
+  LPITEMIDLIST desktop = nullptr;
+  if (FAILED(SHGetSpecialFolderLocation(m_hWnd, CSIDL_DESKTOP, &desktop)) || !desktop) return;
+  const CShellPidl owned(desktop);
+  InsertShellItem(TVI_ROOT, m_desktop.Get(), nullptr, owned.Get(), 0);
+}
+
+HTREEITEM CShellTreeCtrl::InsertShellItem(HTREEITEM parent, IShellFolder *parentFolder, LPCITEMIDLIST parentPidl,
+                                          LPCITEMIDLIST childId, UINT flags) {
+  auto *data = new ShellItemData(parentFolder, pidl::Combine(parentPidl, childId), flags);
+  char text[kTextCapacity] = "";
+  TVINSERTSTRUCTA insert{};
+  insert.hParent = parent;
+  insert.hInsertAfter = TVI_LAST;
+  insert.item.mask = TVIF_TEXT | TVIF_IMAGE | TVIF_SELECTEDIMAGE | TVIF_CHILDREN | TVIF_STATE | TVIF_PARAM;
+  insert.item.pszText = text;
+  insert.item.cchTextMax = kTextCapacity;
+  insert.item.lParam = reinterpret_cast<LPARAM>(data);
+  FillItemDisplay(insert.item, *data);
+  HTREEITEM item = InsertItem(insert);
+  if (!item) delete data;
+  return item;
+}
+
+void CShellTreeCtrl::FillItemDisplay(TVITEMA &item, const ShellItemData &data) const {
+  LPCITEMIDLIST child = data.ChildId();
+  if (item.mask & TVIF_TEXT) {
+    CShellString name;
+    const std::string text = name.GetDisplayNameOf(data.pParentFolder, child, SHGDN_INFOLDER) ? name.ToString() : std::string();
+    const size_t length = std::min(text.size(), static_cast<size_t>(item.cchTextMax > 0 ? item.cchTextMax - 1 : 0));
+    if (item.pszText && item.cchTextMax > 0) {
+      std::memcpy(item.pszText, text.data(), length);
+      item.pszText[length] = '\0';
+    }
+  }
+  if (item.mask & (TVIF_IMAGE | TVIF_SELECTEDIMAGE)) {
+    const ULONG attributes = Attributes(data, SFGAO_GHOSTED | SFGAO_LINK | SFGAO_SHARE | SFGAO_FOLDER);
+    item.mask |= TVIF_STATE;
+    if (attributes & SFGAO_GHOSTED) {
+      item.state |= TVIS_CUT;
+      item.stateMask |= TVIS_CUT;
+    }
+    if (attributes & SFGAO_SHARE) {
+      item.state |= INDEXTOOVERLAYMASK(1);
+      item.stateMask |= TVIS_OVERLAYMASK;
+    } else if (attributes & SFGAO_LINK) {
+      item.state |= INDEXTOOVERLAYMASK(2);
+      item.stateMask |= TVIS_OVERLAYMASK;
+    }
+    item.iImage = SystemIconIndex(data.pidl.Get(), 0);
+    item.iSelectedImage = (attributes & SFGAO_FOLDER) ? SystemIconIndex(data.pidl.Get(), SHGFI_OPENICON) : item.iImage;
+  }
+  if (item.mask & TVIF_CHILDREN) {
+    const ULONG attributes = Attributes(data, SFGAO_FOLDER);
+    if (!(attributes & SFGAO_FOLDER))
+      item.cChildren = 0;
+    else if (!(data.nFlags & kListNonFolders) && !(attributes & SFGAO_REMOVABLE))
+      item.cChildren = (Attributes(data, SFGAO_HASSUBFOLDER) & SFGAO_HASSUBFOLDER) ? 1 : 0;
+    else
+      item.cChildren = 1;
+  }
+}
+
+bool CShellTreeCtrl::FillChildren(HTREEITEM parent, LPCITEMIDLIST parentPidl, UINT flags) {
+  IShellFolder *folder = nullptr;
+  if (pidl::Size(parentPidl) == 0) {
+    folder = m_desktop.Get();
+    if (folder) folder->AddRef();
+  } else if (m_desktop.Get()) {
+    m_desktop.Get()->BindToObject(parentPidl, nullptr, IID_IShellFolder, reinterpret_cast<void **>(&folder));
+  }
+  if (!folder) return false;
+
+  SHCONTF listing = SHCONTF_FOLDERS;
+  if (flags & kListNonFolders) listing |= SHCONTF_NONFOLDERS;
+  if (flags & kListHidden) listing |= SHCONTF_INCLUDEHIDDEN;
+  IEnumIDList *enumerator = nullptr;
+  if (folder->EnumObjects(m_hWnd, listing, &enumerator) == S_OK && enumerator) {
+    SetProgress(0, 0);
+    LPITEMIDLIST id = nullptr;
+    while (enumerator->Next(1, &id, nullptr) == S_OK) {
+      const CShellPidl owned(id);
+      InsertShellItem(parent, folder, parentPidl, owned.Get(), flags & kInheritedFlags);
+      StepProgress(1);
+    }
+    enumerator->Release();
+    if (GetProgress() > 0) {
+      TVSORTCB sort{parent, CompareItems, 0};
+      SortChildrenCB(sort);
+    }
+  }
+  folder->Release();
+  SetProgress(1, 1);
+  return true;
+}
+
+int CShellTreeCtrl::CompareSiblings(const ShellItemData &first, const ShellItemData &second) {
+  if (!first.pParentFolder) return 0;
+  const HRESULT hr = first.pParentFolder->CompareIDs(0, first.ChildId(), second.ChildId());
+  if (FAILED(hr)) return 0;
+  const short order = static_cast<short>(HRESULT_CODE(hr));
+  return order < 0 ? -1 : order > 0 ? 1 : 0;
+}
+
+bool CShellTreeCtrl::FillItemChildren(HTREEITEM item) {
+  const auto *data = item == TVI_ROOT ? nullptr : reinterpret_cast<const ShellItemData *>(GetItemData(item));
+  if (!data) return true;
+  if (!FillChildren(item, data->pidl.Get(), data->nFlags)) return true;
+  char path[MAX_PATH] = "";
+  if (!FolderPath(data, path)) return true;
+  path[3] = '\0';  // the drive root, such as C:\ .
+  return GetDriveTypeA(path) == DRIVE_FIXED;
+}
+
+BOOL CShellTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, LRESULT *result) {
+  if (message == WM_NOTIFY) {
+    const auto *header = reinterpret_cast<const NMHDR *>(lParam);
+    const auto *tree = reinterpret_cast<const NMTREEVIEWA *>(lParam);
+    switch (header->code) {
+      case TVN_SELCHANGEDA:
+      case TVN_SELCHANGEDW: OnSelChanged(tree->itemNew.hItem); break;
+      case NM_RCLICK: ShowFolderSettingsMenu(); break;
+      case TVN_DELETEITEMA:
+      case TVN_DELETEITEMW: delete reinterpret_cast<ShellItemData *>(tree->itemOld.lParam); break;
+      case TVN_SELCHANGINGA:
+      case TVN_SELCHANGINGW:
+      case TVN_KEYDOWN:
+      case NM_SETFOCUS:
+      case NM_KILLFOCUS: break;
+      default: return CWaitingTreeCtrl::OnChildNotify(message, wParam, lParam, result);
+    }
+    *result = 0;
+    return TRUE;
+  }
+  return CWaitingTreeCtrl::OnChildNotify(message, wParam, lParam, result);
+}
+
+void CShellTreeCtrl::OnSelChanged(HTREEITEM item) {
+  if (g_pMainFrame) g_pMainFrame->EnableAccept(false);
+  LoadFolder(item, ".dwg");
+  Select(item, TVGN_DROPHILITE);
+  if (g_pThumbView) g_pThumbView->ReloadFolder();
+  SetFocus();
+}
+
+void CShellTreeCtrl::ShowFolderSettingsMenu() {
+  HTREEITEM item = GetDropHilightItem();
+  char path[MAX_PATH] = "";
+  if (!item || !FolderPath(reinterpret_cast<const ShellItemData *>(GetItemData(item)), path)) return;
+  RECT text{};
+  GetItemRect(item, &text, TRUE);
+  POINT corner{text.right, text.bottom};
+  ClientToScreen(m_hWnd, &corner);
+  fw::CMenu menu;
+  if (!menu.CreatePopupMenu() || !menu.AppendMenu(MF_STRING, kFolderSettingsCommand, "&Folder settings")) return;
+  const UINT chosen = menu.TrackPopupMenu(TPM_RETURNCMD | TPM_RIGHTBUTTON | TPM_NONOTIFY, corner.x, corner.y, m_hWnd);
+  if (chosen != kFolderSettingsCommand) return;
+  CDialogSetLa dialog(this);
+  if (dialog.SetFolder(path)) dialog.DoModal();
+  SetFocus();
+}

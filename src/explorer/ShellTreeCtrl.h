@@ -1,0 +1,36 @@
+// The shell namespace as a tree of folders, rooted at the Desktop: every item carries a
+// ShellItemData record, children are filled on first expansion and sorted in the shell's own
+// order; selecting a folder shows its drawings, and a right click offers its folder settings.
+#pragma once
+
+#include "explorer/ShellItemData.h"
+#include "explorer/WaitingTreeCtrl.h"
+
+class CShellTreeCtrl : public CWaitingTreeCtrl {
+ public:
+  CShellTreeCtrl() = default;
+  ~CShellTreeCtrl() override;
+
+  // Creates the control window and gives it the system's small-icon image list.
+  BOOL Create(DWORD style, const RECT &rect, fw::CWnd *parent, UINT id);
+
+  // The Desktop as the single root item, with flags 0: folders only, hidden ones left out.
+  void InsertRootItem();
+  HTREEITEM InsertShellItem(HTREEITEM parent, IShellFolder *parentFolder, LPCITEMIDLIST parentPidl, LPCITEMIDLIST childId,
+                            UINT flags);
+  // Fills the requested fields of `item` (text, images, state, children button) from the record.
+  void FillItemDisplay(TVITEMA &item, const ShellItemData &data) const;
+  bool FillChildren(HTREEITEM parent, LPCITEMIDLIST parentPidl, UINT flags);
+  static int CompareSiblings(const ShellItemData &first, const ShellItemData &second);
+
+  BOOL OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, LRESULT *result) override;
+
+ protected:
+  bool FillItemChildren(HTREEITEM item) override;
+
+ private:
+  void OnSelChanged(HTREEITEM item);
+  void ShowFolderSettingsMenu();
+
+  CDesktopFolderRef m_desktop;
+};
