@@ -79,6 +79,10 @@ void CWaitingTreeCtrl::PrepareLoading(HTREEITEM item) {
     DeleteChildren(item);
   }
   m_hPending = item;
+  TVITEMA button{};
+  button.mask = TVIF_CHILDREN;
+  button.hItem = item;
+  m_nPendingButton = GetItem(&button) ? button.cChildren : 1;
   UpdateWindow();
   SetRedraw(false);
   TVINSERTSTRUCTA insert{};
@@ -113,7 +117,13 @@ void CWaitingTreeCtrl::RunLoading(HTREEITEM item) {
       children.cChildren = GetChildItem(item) ? 1 : 0;
       SetItem(&children);
     } else if (!GetChildItem(item)) {
-      SetItemState(item, 0, TVIS_EXPANDED);
+      // The tree drops the button with the placeholder, its last child: it comes back.
+      TVITEMA collapsed{};
+      collapsed.mask = TVIF_CHILDREN | TVIF_STATE;
+      collapsed.hItem = item;
+      collapsed.cChildren = m_nPendingButton;
+      collapsed.stateMask = TVIS_EXPANDED;
+      SetItem(&collapsed);
     }
   }
   DropSnapshot();

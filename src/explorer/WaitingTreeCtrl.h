@@ -68,6 +68,7 @@ class CWaitingTreeCtrl : public fw::CTreeCtrl {
   std::atomic<int> m_nTotal{0};
   HTREEITEM m_hPlaceholder = nullptr;
   HTREEITEM m_hPending = nullptr;
+  int m_nPendingButton = 0;  // the pending item's children button before the load
   HTREEITEM m_hStartItem = nullptr;
 
  private:

@@ -1,0 +1,6 @@
+# The waiting tree's loading protocol with both effects, on a tree control of its own.
+target_sources(WaitingTreeTest PRIVATE
+  ${CMAKE_SOURCE_DIR}/src/explorer/WaitingTreeCtrl.cpp
+  ${CMAKE_SOURCE_DIR}/src/fw/Controls.cpp
+  ${CMAKE_SOURCE_DIR}/src/fw/Wnd.cpp)
+target_link_libraries(WaitingTreeTest PRIVATE comctl32 winmm)

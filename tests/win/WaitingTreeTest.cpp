@@ -1,0 +1,153 @@
+// The loading protocol on a real tree control: the placeholder, the animation thread with its
+// tick and progress steps, the join before the children show, the children button, and no
+// second load of an item that has children.
+#include "explorer/HourglassFX.h"
+#include "explorer/ProgressFX.h"
+#include "explorer/WaitingTreeCtrl.h"
+
+#include <gtest/gtest.h>
+
+#include <cstring>
+#include <vector>
+
+namespace {
+class RecordingTree : public CWaitingTreeCtrl {
+ public:
+  int children = 0;
+  bool fillResult = true;
+  int fills = 0, waitBegins = 0, placeholders = 0;
+  bool placeholderGoneDuringFill = false, threadEndedAtShow = false, handlesClosedAtShow = false;
+  RECT placeholderText{};
+  DWORD animationThread = 0;
+
+  LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override {
+    if (message == TVM_INSERTITEMA && std::strcmp(reinterpret_cast<TVINSERTSTRUCTA *>(lParam)->item.pszText, "Loading...") == 0)
+      ++placeholders;
+    if (message == WM_SETREDRAW && wParam && animationThread) {
+      HANDLE thread = OpenThread(SYNCHRONIZE, FALSE, animationThread);
+      threadEndedAtShow = !thread || WaitForSingleObject(thread, 0) == WAIT_OBJECT_0;
+      if (thread) CloseHandle(thread);
+      handlesClosedAtShow = !m_hThread && !m_hTickEvent && !m_hProgressEvent;
+    }
+    return CWaitingTreeCtrl::WindowProc(message, wParam, lParam);
+  }
+
+ protected:
+  void OnWaitBegin(HTREEITEM placeholder) override {
+    ++waitBegins;
+    GetItemRect(placeholder, &placeholderText, TRUE);
+  }
+  void OnWaitTick(bool, int, int) override { animationThread = GetCurrentThreadId(); }
+  bool FillItemChildren(HTREEITEM item) override {
+    ++fills;
+    placeholderGoneDuringFill = GetChildItem(item) == nullptr;
+    SetProgress(0, 0);
+    for (int i = 0; i < children; ++i, Sleep(60)) {
+      InsertItem("child", item);
+      StepProgress(1);
+    }
+    return fillResult;
+  }
+};
+
+class Tree : public CHourglassFX<CProgressFX<RecordingTree>> {
+ public:
+  std::vector<int> frames, fillWidths;
+
+ protected:
+  void OnWaitTick(bool isTick, int total, int done) override {
+    CHourglassFX::OnWaitTick(isTick, total, done);
+    if (isTick)
+      frames.push_back(FrameIndex());
+    else
+      fillWidths.push_back(FillRect().right - FillRect().left);
+  }
+};
+
+class WaitingTree : public ::testing::Test {
+ protected:
+  void SetUp() override {
+    ASSERT_TRUE(m_parent.CreateEx(0, nullptr, "tree", WS_OVERLAPPEDWINDOW | WS_VISIBLE, RECT{0, 0, 400, 300}, HWND{}, 0));
+    ASSERT_TRUE(m_tree.Create(WS_CHILD | WS_VISIBLE | TVS_HASBUTTONS, RECT{0, 0, 380, 260}, &m_parent, 1));
+    m_tree.SetImageList(m_images, TVSIL_NORMAL);
+    m_tree.SetTickPeriod(125);
+  }
+  void TearDown() override { ImageList_Destroy(m_images); }
+  HTREEITEM Folder(const char *name) const {
+    TVINSERTSTRUCTA insert{TVI_ROOT, TVI_LAST, {}};
+    insert.item.mask = TVIF_TEXT | TVIF_CHILDREN;
+    insert.item.pszText = const_cast<char *>(name);
+    insert.item.cChildren = 1;
+    return m_tree.InsertItem(insert);
+  }
+  int ChildrenButton(HTREEITEM item) const {
+    TVITEMA query{TVIF_CHILDREN, item};
+    m_tree.GetItem(&query);
+    return query.cChildren;
+  }
+  void Notify(UINT code, HTREEITEM item) const {
+    NMTREEVIEWA notice{{m_tree.m_hWnd, 1, code}, TVE_EXPAND};
+    notice.itemNew.hItem = item;
+    SendMessageA(m_parent.m_hWnd, WM_NOTIFY, 1, reinterpret_cast<LPARAM>(&notice));
+  }
+
+  fw::CWnd m_parent;
+  Tree m_tree;
+  HIMAGELIST m_images = ImageList_Create(16, 16, ILC_COLOR32, 1, 1);
+};
+
+TEST_F(WaitingTree, LoadsBehindThePlaceholderAndJoinsTheAnimationBeforeShowing) {
+  m_tree.children = 12;
+  HTREEITEM folder = Folder("folder");
+  m_tree.Expand(folder, TVE_EXPAND);
+
+  EXPECT_EQ(m_tree.fills, 1);
+  EXPECT_EQ(m_tree.placeholders, 1);
+  EXPECT_TRUE(m_tree.placeholderGoneDuringFill);
+  EXPECT_TRUE(m_tree.threadEndedAtShow);
+  EXPECT_TRUE(m_tree.handlesClosedAtShow);
+  ASSERT_GE(m_tree.frames.size(), 3u) << "12 children at 60 ms take several ticks";
+  for (size_t i = 0; i < m_tree.frames.size(); ++i) EXPECT_EQ(m_tree.frames[i], static_cast<int>((i + 1) % 10));
+  ASSERT_FALSE(m_tree.fillWidths.empty());
+  for (int width : m_tree.fillWidths) EXPECT_TRUE(width >= 0 && width <= 50) << width;
+
+  const RECT &text = m_tree.placeholderText, &bar = m_tree.BarRect(), &icon = m_tree.IconRect();
+  const int textHeight = text.bottom - text.top, barHeight = textHeight - 2 * std::max(0, (textHeight - 16) / 2);
+  EXPECT_EQ(bar.left, text.right + 3);
+  EXPECT_EQ(bar.right - bar.left, 56);
+  EXPECT_EQ(bar.bottom - bar.top, barHeight);
+  EXPECT_EQ(m_tree.FillRect().left, bar.left + 3);
+  EXPECT_EQ(icon.right, text.left - 3);
+  EXPECT_EQ(icon.right - icon.left, GetSystemMetrics(SM_CXSMICON));
+
+  int count = 0;
+  for (HTREEITEM child = m_tree.GetChildItem(folder); child; child = m_tree.GetNextSiblingItem(child)) ++count;
+  EXPECT_EQ(count, 12);
+  EXPECT_EQ(ChildrenButton(folder), 1);
+}
+
+TEST_F(WaitingTree, ASecondExpansionNeitherInsertsAPlaceholderNorStartsAThread) {
+  m_tree.children = 2;
+  HTREEITEM folder = Folder("folder");
+  m_tree.Expand(folder, TVE_EXPAND);
+  m_tree.Expand(folder, TVE_COLLAPSE);
+  m_tree.Expand(folder, TVE_EXPAND);
+  Notify(TVN_ITEMEXPANDINGA, folder);  // as a tree that reports every expansion would
+  Notify(TVN_ITEMEXPANDEDA, folder);
+  EXPECT_EQ(m_tree.fills, 1);
+  EXPECT_EQ(m_tree.placeholders, 1);
+  EXPECT_EQ(m_tree.waitBegins, 1);
+}
+
+TEST_F(WaitingTree, ChildrenButtonFollowsWhatWasFoundOnlyWhenTheFillSaysSo) {
+  HTREEITEM followed = Folder("fixed drive");
+  m_tree.Expand(followed, TVE_EXPAND);
+  EXPECT_EQ(ChildrenButton(followed), 0);
+
+  m_tree.fillResult = false;
+  HTREEITEM kept = Folder("removable drive");
+  m_tree.Expand(kept, TVE_EXPAND);
+  EXPECT_EQ(ChildrenButton(kept), 1);
+  EXPECT_EQ(m_tree.GetItemState(kept, TVIS_EXPANDED) & TVIS_EXPANDED, 0u);
+}
+}  // namespace
