@@ -1,0 +1,84 @@
+// The folder tree of a browse call: the Desktop as its single root, the walk along a start
+// folder typed in another letter case and along the remembered path, the scanned folder as the
+// current directory, siblings in the shell's order, and the button of a folder found empty.
+#include "ScratchFolder.h"
+#include "TreeWatch.h"
+
+#include <gtest/gtest.h>
+#include <shlobj.h>
+#include <shlwapi.h>
+
+#include <algorithm>
+#include <cctype>
+
+namespace {
+std::string Lower(std::string text) {
+  std::transform(text.begin(), text.end(), text.begin(), [](unsigned char c) { return std::tolower(c); });
+  return text;
+}
+
+std::string DesktopName() {
+  IShellFolder *desktop = nullptr;
+  SHGetDesktopFolder(&desktop);
+  ITEMIDLIST empty{};
+  STRRET name{};
+  char text[MAX_PATH] = "";
+  if (SUCCEEDED(desktop->GetDisplayNameOf(&empty, SHGDN_INFOLDER, &name))) StrRetToBufA(&name, &empty, text, MAX_PATH);
+  desktop->Release();
+  return text;
+}
+
+class ShellTree : public ::testing::Test {
+ protected:
+  static void SetUpTestSuite() { OleInitialize(nullptr); }
+  static void TearDownTestSuite() { OleUninitialize(); }
+  void SetUp() override { ASSERT_EQ(m_module.LoadResult(), kDevhostLoaded); }
+  StateFileGuard m_state;
+  LoadedModule m_module;
+};
+
+TEST_F(ShellTree, TheDesktopIsTheSingleRoot) {
+  m_state.Remove();
+  std::vector<std::string> roots;
+  Browse(BrowseArgs(L""), [&](HWND frame) {
+    roots = ChildTexts(FindTree(frame), nullptr);
+    PostMessageA(frame, WM_CLOSE, 0, 0);
+  });
+  EXPECT_EQ(roots, std::vector<std::string>{DesktopName()});
+}
+
+TEST_F(ShellTree, OpensAlongTheStartFolderInAnyCaseThenAlongTheRememberedPath) {
+  m_state.Remove();
+  const ScratchFolder scratch("tree");
+  const std::string plans = scratch.Path() + "\\Plans";
+  CreateDirectoryA(plans.c_str(), nullptr);
+  for (const char *name : {"b", "A", "C"}) CreateDirectoryA((plans + "\\" + name).c_str(), nullptr);
+  std::string upper = plans + "\\";
+  std::transform(upper.begin(), upper.end(), upper.begin(), [](unsigned char c) { return std::toupper(c); });
+
+  for (const std::string &start : {upper, std::string()}) {
+    std::string selected, current, emptyButton = "?";
+    std::vector<std::string> children;
+    Browse(BrowseArgs(std::wstring(start.begin(), start.end()).c_str()), [&](HWND frame) {
+      HWND tree = FindTree(frame);
+      HTREEITEM caret = TreeNext(tree, nullptr, TVGN_CARET);
+      selected = ItemText(tree, caret);
+      char directory[MAX_PATH] = "";
+      GetCurrentDirectoryA(MAX_PATH, directory);
+      current = directory;
+      children = ChildTexts(tree, caret);
+      HTREEITEM empty = ChildNamed(tree, caret, "A");
+      SendMessageA(tree, TVM_EXPAND, TVE_EXPAND, reinterpret_cast<LPARAM>(empty));
+      TVITEMA button{TVIF_CHILDREN, empty};
+      SendMessageA(tree, TVM_GETITEMA, 0, reinterpret_cast<LPARAM>(&button));
+      emptyButton = std::to_string(button.cChildren);
+      PostMessageA(frame, WM_CLOSE, 0, 0);
+    });
+    const char *how = start.empty() ? "remembered path" : "start folder";
+    EXPECT_EQ(selected, "Plans") << how;
+    EXPECT_EQ(Lower(current), Lower(plans)) << how;
+    EXPECT_EQ(children, (std::vector<std::string>{"A", "b", "C"})) << how << ": the shell's order";
+    EXPECT_EQ(emptyButton, "0") << how << ": a fixed-drive folder found empty";
+  }
+}
+}  // namespace
