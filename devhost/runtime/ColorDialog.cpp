@@ -115,6 +115,7 @@ void Accept(DialogState &state) {
   state.index = typed;
   state.accepted = true;
   state.done = true;
+  PostMessageW(state.dialog, WM_NULL, 0, 0);  // the loop looks at `done` once a message arrives
 }
 
 LRESULT CALLBACK GridProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
@@ -156,12 +157,14 @@ LRESULT CALLBACK DialogProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lPara
         Accept(*state);
       } else if (LOWORD(wParam) == IDCANCEL) {
         state->done = true;
+        PostMessageW(hwnd, WM_NULL, 0, 0);
       } else if (LOWORD(wParam) == kIndexEdit && HIWORD(wParam) == EN_CHANGE && !state->settingText) {
         if (const int typed = TypedIndex(state->edit)) Select(*state, typed, false);
       }
       return 0;
     case WM_CLOSE:
       if (state) state->done = true;
+      PostMessageW(hwnd, WM_NULL, 0, 0);
       return 0;
     default: break;
   }
