@@ -75,11 +75,16 @@ HTREEITEM CShellTreeCtrl::InsertShellItem(HTREEITEM parent, IShellFolder *parent
   TVINSERTSTRUCTA insert{};
   insert.hParent = parent;
   insert.hInsertAfter = TVI_LAST;
-  insert.item.mask = TVIF_TEXT | TVIF_IMAGE | TVIF_SELECTEDIMAGE | TVIF_CHILDREN | TVIF_STATE | TVIF_PARAM;
+  insert.item.mask = TVIF_TEXT | TVIF_CHILDREN | TVIF_STATE | TVIF_PARAM;
   insert.item.pszText = text;
   insert.item.cchTextMax = kTextCapacity;
   insert.item.lParam = reinterpret_cast<LPARAM>(data);
   FillItemDisplay(insert.item, *data);
+  // The shell takes milliseconds to find an item's icon: the tree asks for it when it first
+  // draws the item, so a folder of thousands opens at the cost of the few it shows.
+  insert.item.mask |= TVIF_IMAGE | TVIF_SELECTEDIMAGE;
+  insert.item.iImage = I_IMAGECALLBACK;
+  insert.item.iSelectedImage = I_IMAGECALLBACK;
   HTREEITEM item = InsertItem(insert);
   if (!item) delete data;
   return item;
@@ -96,9 +101,8 @@ void CShellTreeCtrl::FillItemDisplay(TVITEMA &item, const ShellItemData &data) c
       item.pszText[length] = '\0';
     }
   }
-  if (item.mask & (TVIF_IMAGE | TVIF_SELECTEDIMAGE)) {
-    const ULONG attributes = Attributes(data, SFGAO_GHOSTED | SFGAO_LINK | SFGAO_SHARE | SFGAO_FOLDER);
-    item.mask |= TVIF_STATE;
+  if (item.mask & TVIF_STATE) {
+    const ULONG attributes = Attributes(data, SFGAO_GHOSTED | SFGAO_LINK | SFGAO_SHARE);
     if (attributes & SFGAO_GHOSTED) {
       item.state |= TVIS_CUT;
       item.stateMask |= TVIS_CUT;
@@ -110,8 +114,11 @@ void CShellTreeCtrl::FillItemDisplay(TVITEMA &item, const ShellItemData &data) c
       item.state |= INDEXTOOVERLAYMASK(2);
       item.stateMask |= TVIS_OVERLAYMASK;
     }
+  }
+  if (item.mask & (TVIF_IMAGE | TVIF_SELECTEDIMAGE)) {
     item.iImage = SystemIconIndex(data.pidl.Get(), 0);
-    item.iSelectedImage = (attributes & SFGAO_FOLDER) ? SystemIconIndex(data.pidl.Get(), SHGFI_OPENICON) : item.iImage;
+    item.iSelectedImage =
+        (Attributes(data, SFGAO_FOLDER) & SFGAO_FOLDER) ? SystemIconIndex(data.pidl.Get(), SHGFI_OPENICON) : item.iImage;
   }
   if (item.mask & TVIF_CHILDREN) {
     const ULONG attributes = Attributes(data, SFGAO_FOLDER);
@@ -180,6 +187,8 @@ BOOL CShellTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, L
     const auto *header = reinterpret_cast<const NMHDR *>(lParam);
     const auto *tree = reinterpret_cast<const NMTREEVIEWA *>(lParam);
     switch (header->code) {
+      case TVN_GETDISPINFOA:
+      case TVN_GETDISPINFOW: OnGetDispInfo(reinterpret_cast<NMTVDISPINFOA *>(lParam)->item); break;
       case TVN_SELCHANGEDA:
       case TVN_SELCHANGEDW: OnSelChanged(tree->itemNew.hItem); break;
       case NM_RCLICK: ShowFolderSettingsMenu(); break;
@@ -196,6 +205,14 @@ BOOL CShellTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, L
     return TRUE;
   }
   return CWaitingTreeCtrl::OnChildNotify(message, wParam, lParam, result);
+}
+
+void CShellTreeCtrl::OnGetDispInfo(TVITEMA &item) const {
+  const auto *data = reinterpret_cast<const ShellItemData *>(item.lParam);
+  item.mask &= TVIF_IMAGE | TVIF_SELECTEDIMAGE;
+  if (!data || !item.mask) return;
+  FillItemDisplay(item, *data);
+  item.mask |= TVIF_DI_SETITEM;  // found once, kept by the tree
 }
 
 void CShellTreeCtrl::OnSelChanged(HTREEITEM item) {

@@ -29,6 +29,7 @@ class CShellTreeCtrl : public CWaitingTreeCtrl {
   bool FillItemChildren(HTREEITEM item) override;
 
  private:
+  void OnGetDispInfo(TVITEMA &item) const;
   void OnSelChanged(HTREEITEM item);
   void ShowFolderSettingsMenu();
 
