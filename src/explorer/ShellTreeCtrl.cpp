@@ -224,7 +224,18 @@ void CShellTreeCtrl::OnSelChanged(HTREEITEM item) {
 }
 
 void CShellTreeCtrl::ShowFolderSettingsMenu() {
-  HTREEITEM item = GetDropHilightItem();
+  // The clicked item is the one the menu is for. Some tree controls leave the drop highlight
+  // where it was during a right click: the click's own position decides then.
+  const DWORD position = GetMessagePos();
+  TVHITTESTINFO hit{{static_cast<short>(LOWORD(position)), static_cast<short>(HIWORD(position))}};
+  ScreenToClient(m_hWnd, &hit.pt);
+  if (HitTest(&hit) && (hit.flags & TVHT_ONITEM)) Select(hit.hItem, TVGN_DROPHILITE);
+  RunFolderSettingsMenu(GetDropHilightItem());
+  // The highlight goes back to the folder shown.
+  Select(GetSelectedItem(), TVGN_DROPHILITE);
+}
+
+void CShellTreeCtrl::RunFolderSettingsMenu(HTREEITEM item) {
   char path[MAX_PATH] = "";
   if (!item || !FolderPath(reinterpret_cast<const ShellItemData *>(GetItemData(item)), path)) return;
   RECT text{};
@@ -234,8 +245,9 @@ void CShellTreeCtrl::ShowFolderSettingsMenu() {
   fw::CMenu menu;
   if (!menu.CreatePopupMenu() || !menu.AppendMenu(MF_STRING, kFolderSettingsCommand, "&Folder settings")) return;
   const UINT chosen = menu.TrackPopupMenu(TPM_RETURNCMD | TPM_RIGHTBUTTON | TPM_NONOTIFY, corner.x, corner.y, m_hWnd);
-  if (chosen != kFolderSettingsCommand) return;
-  CDialogSetLa dialog(this);
-  if (dialog.SetFolder(path)) dialog.DoModal();
-  SetFocus();
+  if (chosen == kFolderSettingsCommand) {
+    CDialogSetLa dialog(this);
+    if (dialog.SetFolder(path)) dialog.DoModal();
+    SetFocus();
+  }
 }

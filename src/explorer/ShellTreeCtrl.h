@@ -32,6 +32,7 @@ class CShellTreeCtrl : public CWaitingTreeCtrl {
   void OnGetDispInfo(TVITEMA &item) const;
   void OnSelChanged(HTREEITEM item);
   void ShowFolderSettingsMenu();
+  void RunFolderSettingsMenu(HTREEITEM item);
 
   CDesktopFolderRef m_desktop;
 };

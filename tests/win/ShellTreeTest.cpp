@@ -37,14 +37,25 @@ class ShellTree : public ::testing::Test {
   LoadedModule m_module;
 };
 
-TEST_F(ShellTree, TheDesktopIsTheSingleRoot) {
+TEST_F(ShellTree, TheDesktopIsTheSingleRootAndTabLeavesForTheViewEscapeCancels) {
   m_state.Remove();
   std::vector<std::string> roots;
-  Browse(BrowseArgs(L""), [&](HWND frame) {
-    roots = ChildTexts(FindTree(frame), nullptr);
-    PostMessageA(frame, WM_CLOSE, 0, 0);
+  std::string focusAfterTab;
+  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    HWND tree = FindTree(frame);
+    roots = ChildTexts(tree, nullptr);
+    PostMessageA(tree, WM_KEYDOWN, VK_TAB, 0);
+    SendMessageA(tree, WM_NULL, 0, 0);
+    GUITHREADINFO focus{sizeof focus};
+    GetGUIThreadInfo(GetWindowThreadProcessId(tree, nullptr), &focus);
+    focusAfterTab = focus.hwndFocus == tree                                                                          ? "tree"
+                    : focus.hwndFocus != GetParent(tree) && GetParent(focus.hwndFocus) == GetParent(GetParent(tree)) ? "pane"
+                                                                                                                     : "?";
+    PostMessageA(tree, WM_KEYDOWN, VK_ESCAPE, 0);
   });
   EXPECT_EQ(roots, std::vector<std::string>{DesktopName()});
+  EXPECT_EQ(focusAfterTab, "pane") << "Tab gives the focus to the thumbnail view";
+  EXPECT_EQ(outcome.resultKind, RTNIL) << "Escape in the tree cancels";
 }
 
 TEST_F(ShellTree, OpensAlongTheStartFolderInAnyCaseThenAlongTheRememberedPath) {

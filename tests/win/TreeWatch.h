@@ -54,7 +54,10 @@ inline HWND OpenFolderSettings(HWND tree) {
   RECT rect{};
   *reinterpret_cast<HTREEITEM *>(&rect) = TreeNext(tree, nullptr, TVGN_CARET);
   SendMessageA(tree, TVM_GETITEMRECT, TRUE, reinterpret_cast<LPARAM>(&rect));
-  const LPARAM at = MAKELPARAM((rect.left + rect.right) / 2, (rect.top + rect.bottom) / 2);
+  POINT centre{(rect.left + rect.right) / 2, (rect.top + rect.bottom) / 2};
+  const LPARAM at = MAKELPARAM(centre.x, centre.y);
+  ClientToScreen(tree, &centre);
+  SetCursorPos(centre.x, centre.y);  // where the click happens, as the tree reads it
   PostMessageA(tree, WM_RBUTTONDOWN, MK_RBUTTON, at);
   PostMessageA(tree, WM_RBUTTONUP, 0, at);
   HWND menu = WaitForWindow("#32768", nullptr, 5000);
