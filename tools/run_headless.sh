@@ -29,7 +29,8 @@ press() {  # press WINDOW KEY
   xdotool key --clearmodifiers "$2"
 }
 
-explorer=$(wait_for_window '^ombra3$')
+# The frame's title is "ombra3" until it shows a folder, then the folder's path.
+explorer=$(wait_for_window '^ombra3$|^[A-Za-z]:\\')
 if [ -z "$explorer" ]; then
   echo "lumvex: the explorer did not open" >&2
   kill "$host" 2>/dev/null || true

@@ -3,6 +3,7 @@
 #include "catalogue/FolderScan.h"
 #include "catalogue/Ombra3Doc.h"
 #include "fw/WinApp.h"
+#include "host/ModuleGlobals.h"
 #include "thumbs/Ombra3View.h"
 
 CLeftView *g_pLeftView = nullptr;
@@ -11,6 +12,26 @@ CLeftView::CLeftView() { g_pLeftView = this; }
 
 CLeftView::~CLeftView() {
   if (g_pLeftView == this) g_pLeftView = nullptr;
+}
+
+namespace {
+// Until the folder tree selects folders, the explorer shows the call's start folder (the drive's
+// label " (Z:)" and what follows it in the start shell path), else the remembered one.
+std::string StartFolder() {
+  const std::string shellPath = g_szStartShellPath;
+  const size_t drive = shellPath.find(":)");
+  if (drive == std::string::npos || drive < 2 || shellPath[drive - 2] != '(') return g_pDoc ? g_pDoc->m_strPath : "";
+  const size_t rest = shellPath.find('\\', drive);
+  return shellPath.substr(drive - 1, 2) + (rest == std::string::npos ? "\\" : shellPath.substr(rest));
+}
+}  // namespace
+
+void CLeftView::OnInitialUpdate() {
+  CView::OnInitialUpdate();
+  const std::string folder = StartFolder();
+  if (folder.empty()) return;
+  ScanFolder(folder, ".dwg");
+  if (g_pThumbView) g_pThumbView->ReloadFolder();
 }
 
 void CLeftView::RefreshSelectedFolder() {

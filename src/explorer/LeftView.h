@@ -11,6 +11,7 @@ class CLeftView : public fw::CView {
   // Scans the shown folder again and lets the thumbnail view show it (after a file command).
   void RefreshSelectedFolder();
 
+  void OnInitialUpdate() override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 };
 
