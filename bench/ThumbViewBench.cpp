@@ -14,6 +14,7 @@
 #include "preview/PreviewTestApi.h"
 
 #include <windows.h>
+#include <ole2.h>
 
 #include <algorithm>
 #include <cstdio>
@@ -193,6 +194,8 @@ void Measure(HWND frame) {
   }
   DestroyWindow(canvas);
 
+  // Decoded previews the painter keeps hold GDI objects of their own: counted without them.
+  devhostPreviewClearCache();
   const int windowsBefore = ExplorerWindows(frame);
   const int gdiBefore = LiveGdiObjects();
   int tilesMax = 0;
@@ -204,6 +207,7 @@ void Measure(HWND frame) {
     SendMessageA(view, kRefreshFolder, 0, 0);
     tilesMax = std::max(tilesMax, CountWindows(view, "FwWnd"));
   }
+  devhostPreviewClearCache();
   const int windowsGrowth = ExplorerWindows(frame) - windowsBefore;
   const int gdiGrowth = LiveGdiObjects() - gdiBefore;
 

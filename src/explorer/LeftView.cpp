@@ -29,9 +29,7 @@ std::string StartFolder() {
 void CLeftView::OnInitialUpdate() {
   CView::OnInitialUpdate();
   const std::string folder = StartFolder();
-  if (folder.empty()) return;
-  ScanFolder(folder, ".dwg");
-  if (g_pThumbView) g_pThumbView->ReloadFolder();
+  if (!folder.empty() && ScanFolder(folder, ".dwg") && g_pThumbView) g_pThumbView->ReloadFolder();
 }
 
 void CLeftView::RefreshSelectedFolder() {
