@@ -9,7 +9,7 @@
 //   view_tiles_max               most tile windows alive during those steps
 //   view_gdi_growth              live GDI objects after, minus before
 // Prints one figure a line: name value unit.
-#include "ModuleHarness.h"
+#include "ExplorerHarness.h"
 #include "catalogue/FolderScan.h"
 #include "preview/PreviewTestApi.h"
 
@@ -230,6 +230,7 @@ int main() {
   }
   OleInitialize(nullptr);
   {
+    StateFileGuard state;  // the browse remembers the bench folder: the state file is put back after
     LoadedModule module;
     std::thread watcher([] {
       if (HWND frame = FindFrame()) Measure(frame);

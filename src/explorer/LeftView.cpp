@@ -15,12 +15,12 @@ CLeftView::~CLeftView() {
 }
 
 namespace {
-// Until the folder tree selects folders, the explorer shows the call's start folder (the drive's
-// label " (Z:)" and what follows it in the start shell path), else the remembered one.
+// Until the folder tree selects folders, the explorer shows the call's start folder: the drive of
+// the label " (Z:)" in the start shell path and what follows it.
 std::string StartFolder() {
   const std::string shellPath = g_szStartShellPath;
   const size_t drive = shellPath.find(":)");
-  if (drive == std::string::npos || drive < 2 || shellPath[drive - 2] != '(') return g_pDoc ? g_pDoc->m_strPath : "";
+  if (drive == std::string::npos || drive < 2 || shellPath[drive - 2] != '(') return std::string();
   const size_t rest = shellPath.find('\\', drive);
   return shellPath.substr(drive - 1, 2) + (rest == std::string::npos ? "\\" : shellPath.substr(rest));
 }

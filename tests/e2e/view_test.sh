@@ -51,7 +51,6 @@ eval "$(xdotool getwindowgeometry --shell "$frame")"
 view_x=$((X + 163)) view_y=$((Y + 74))
 tile() { echo $((view_x + 86 + 178 * ($1 % 4))) $((view_y + 70 + 163 * ($1 / 4))); }
 title() { sleep 1.5; xdotool getwindowname "$frame"; }
-xdotool windowactivate --sync "$frame" >/dev/null 2>&1 || xdotool windowfocus "$frame" >/dev/null 2>&1
 
 xdotool mousemove $(tile 0) click 1
 check "a click chooses a drawing" "$folder\\${names[0]}" "$(title)"
@@ -75,11 +74,9 @@ check "larger pictures: the third column now shows the second drawing" "$folder\
 xdotool mousemove $((view_x + 60)) $((view_y + 179 + 12)) click --repeat 2 --delay 80 1 type "renamed.dwg"
 xdotool key Return
 sleep 1
-check "rename in place" "yes no" "$([ -f "$work/drawings/renamed.dwg" ] && echo yes || echo no) \
-$([ -f "$work/drawings/${names[0]}" ] || ls "$work/drawings" | grep -qix "${names[0]}" && echo yes || echo no)"
+check "rename in place" "renamed.dwg" "$(ls "$work/drawings" | tr 'A-Z' 'a-z' | grep -x -e renamed.dwg -e "${names[0]}")"
 
 import -window root "$shots/view.png"
-check "screenshot saved" "yes" "$([ -s "$shots/view.png" ] && echo yes || echo no)"
 mapfile -t names < <(ls "$work/drawings" | tr 'A-Z' 'a-z' | LC_ALL=C sort)
 xdotool mousemove $(tile 0) click --repeat 2 --delay 80 1
 for _ in $(seq 50); do
