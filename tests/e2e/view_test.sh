@@ -46,8 +46,7 @@ done
 check "the explorer shows the folder" "$folder\\" "$(xdotool getwindowname "$frame" 2>/dev/null)"
 sleep 1
 eval "$(xdotool getwindowgeometry --shell "$frame")"
-# The view's client area starts below the tool bar, right of the folder pane; tiles are 178
-# pixels apart, rows 163 (143 of picture, the caption band beneath), 4 columns here.
+# The view starts below the tool bar, right of the folder pane; 4 columns 178 pixels apart, rows 163.
 view_x=$((X + 163)) view_y=$((Y + 74))
 tile() { echo $((view_x + 86 + 178 * ($1 % 4))) $((view_y + 70 + 163 * ($1 / 4))); }
 title() { sleep 1.5; xdotool getwindowname "$frame"; }
@@ -60,8 +59,7 @@ check "Ctrl+click adds one" "$folder\\${names[5]}" "$(title)"
 xdotool mousemove $((X + 240)) $((Y + 55)) click 1 type "${names[12]:0:6}"
 check "the search box finds by prefix" "$folder\\${names[12]}" "$(title)"
 
-# The search put row 3 at the top; a notch down scrolls three rows, the rows that come into view
-# with their tiles.
+# The search put row 3 at the top; a notch down scrolls three rows that come with their tiles.
 xdotool mousemove $(tile 1) click 5 sleep 0.5 click 1
 check "the wheel scrolls whole rows" "$folder\\${names[$((6 * 4 + 1))]}" "$(title)"
 xdotool key Home
