@@ -1,31 +1,89 @@
-// The thumbnail view: the right pane of the explorer, showing the catalogue of the shown folder.
+// The thumbnail view: the right pane of the explorer, the drawings of the shown folder as a grid
+// of tiles in catalogue order. Only a ring of the visible rows plus two has tiles; scrolling by a
+// row destroys the row that leaves the ring and creates the one that enters it in the same slots,
+// so any folder costs a few rows of windows. The scroll range is capped; the view keeps its own
+// top row and wraps the scroll bar near the ends of the range.
 #pragma once
 
 #include "fw/View.h"
+#include "thumbs/DwgThumbnail.h"
+#include "thumbs/TileToolTip.h"
+
+#include <memory>
 
 class COmbra3View : public fw::CScrollView {
  public:
   COmbra3View();
   ~COmbra3View() override;
 
-  // Picture size of the tiles: the remembered one when both values are non-zero.
   void GetPictureSize(int &width, int &height) const;
-  // Shows a freshly scanned catalogue: the folder in the frame's title, its layer in the frame's
-  // label, then sorted and laid out from the first row.
+  // Shows a freshly scanned catalogue from its first row, the folder in the frame's title.
   void ReloadFolder();
-  // Lays out from the first row, sorting the catalogue by the frame's key first when asked.
+  // Columns from the width, optionally sorted by the frame's key, first row, tiles built.
   void ResetAndBuild(BOOL sort);
+  // The row of the record at the top.
+  void ScrollToRecord(int index);
+  void UnselectAll();
   void SelectAll();
   void CopySelected();
+  void DeleteSelected();
   bool PasteFiles();
+  // Scans the folder again once the current message is done (after a rename in a caption box,
+  // whose window and object the rescan destroys).
+  void PostRefreshFolder() const;
+  HWND ToolTipWindow() const { return m_toolTip.m_hWnd; }
 
+  BOOL PreCreateWindow(CREATESTRUCTA &cs) override;
+  BOOL PreTranslateMessage(MSG *msg) override;
+  BOOL OnScroll(UINT scrollCode, UINT pos, BOOL doScroll = TRUE) override;
+  void OnInitialUpdate() override;
+  void OnActivateView(BOOL activate, fw::CView *activateView, fw::CView *deactiveView) override;
   BOOL OnCmdMsg(UINT id, int code, fw::CCmdUI *cmdUI) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
- private:
-  int m_nPictureWidth = 173;
   int m_nPictureHeight = 143;
+  int m_nPictureWidth = 173;
+  int m_nGap = 5;
+  int m_nRingRows = 11;
+  int m_nTopRow = 0;
+  int m_nColumns = 60;
+  int m_nLayoutColumns = 60;
+  int m_nRecordCount = 0;
+  int m_nTotalRows = 0;
+  int m_nVisibleRows = 0;
+  BOOL m_bInRelayout = FALSE;
+
+ private:
+  int ColStep() const { return m_nPictureWidth + m_nGap; }
+  int RowStep() const;
+  RECT PictureRect(int ringRow) const;
+  int ClientHeight() const;
+
+  void UpdateScrollSizes();
+  void DestroyTileWindows();
+  void BuildTiles();
+  void CreateRow(int row, RECT r);
+  void RebuildAtTopRow();
+  void Relayout(BOOL fitFrame);
+  void ChangePictureSize(bool larger);
+  BOOL LineDown(int x, int y, int totalHeight);
+  BOOL LineUp(int x, int y, int totalHeight);
+  void OnKey(WPARAM key);
+  void OnMouseWheel(short delta);
+  void OnBackgroundMenu(LPARAM point);
+  void OnPaint();
+
+  // The tile ring, held by value; its column count and size as captured when it was built.
+  std::unique_ptr<exCDwgThumbnail[]> m_tiles;
+  int m_nRingColumns = 0;
+  int m_nRingSize = 0;
+  CViewToolTip m_toolTip;
+  int m_nWheelDelta = 0;
+  bool m_bBuilding = false;
+  bool m_bSizePending = false;
 };
 
 // The thumbnail view while the explorer is open, or null.
 extern COmbra3View *g_pThumbView;
+// Height of the caption band under each picture: screen text height + 2 + the edge height.
+extern int g_nCaptionHeight;

@@ -1,0 +1,90 @@
+#!/usr/bin/env bash
+# The thumbnail view through the development host with real X input: clicks, Ctrl+click, the
+# search box, the wheel, a larger picture size, renaming in place and the double click that
+# accepts, checked by the frame's title, the files on disk and the printed result list.
+# Usage: view_test.sh BIN_DIR REPO_ROOT SCREENSHOT_DIR
+set -uo pipefail
+bin=$1
+root=$2
+shots=$3
+state="$bin/Lumvex1.ini"
+passed=0
+failed=0
+work=$(mktemp -d)
+saved=""
+[ -f "$state" ] && saved="$work/saved.ini" && cp "$state" "$saved"
+cleanup() {
+  if [ -n "$saved" ]; then cp "$saved" "$state"; else rm -f "$state"; fi
+  rm -rf "$work"
+}
+trap cleanup EXIT
+mkdir -p "$shots"
+
+check() {
+  if [ "$2" == "$3" ]; then
+    passed=$((passed + 1))
+  else
+    failed=$((failed + 1))
+    printf 'FAILED %s\n--- expected\n%s\n--- actual\n%s\n' "$1" "$2" "$3"
+  fi
+}
+
+python3 "$root/tools/make_sample_drawings.py" "$work/drawings" 40 --seed 2 >/dev/null
+mapfile -t names < <(ls "$work/drawings" | tr 'A-Z' 'a-z' | LC_ALL=C sort)
+folder="Z:$(echo "$work/drawings" | tr '/' '\\')"
+printf '[Size]\r\nSplitterSize=150\r\nWindowWidth=1000\r\nWindowHeight=700\r\n\r\n[View]\r\nSort=0\r\n' >"$state"
+
+"$root/cmake/wine-run" "$bin/devhost.exe" --batch --eval "(Lumvex 0 0 \"${folder//\\/\\\\}\\\\\" \"Insert\" \"Close\")" \
+  >"$work/out" 2>"$work/err" &
+host=$!
+frame=""
+for _ in $(seq 100); do
+  frame=$(xdotool search --onlyvisible --name '^Z:' 2>/dev/null | head -n 1)
+  [ -n "$frame" ] && break
+  sleep 0.2
+done
+check "the explorer shows the folder" "$folder\\" "$(xdotool getwindowname "$frame" 2>/dev/null)"
+sleep 1
+eval "$(xdotool getwindowgeometry --shell "$frame")"
+# The view starts below the tool bar, right of the folder pane; 4 columns 178 pixels apart, rows 163.
+view_x=$((X + 163)) view_y=$((Y + 74))
+tile() { echo $((view_x + 86 + 178 * ($1 % 4))) $((view_y + 70 + 163 * ($1 / 4))); }
+title() { sleep 1.5; xdotool getwindowname "$frame"; }
+
+xdotool mousemove $(tile 0) click 1
+check "a click chooses a drawing" "$folder\\${names[0]}" "$(title)"
+xdotool mousemove $(tile 5) keydown ctrl click 1 keyup ctrl
+check "Ctrl+click adds one" "$folder\\${names[5]}" "$(title)"
+
+xdotool mousemove $((X + 240)) $((Y + 55)) click 1 type "${names[12]:0:6}"
+check "the search box finds by prefix" "$folder\\${names[12]}" "$(title)"
+
+# The search put row 3 at the top; a notch down scrolls three rows that come with their tiles.
+xdotool mousemove $(tile 1) click 5 sleep 0.5 click 1
+check "the wheel scrolls whole rows" "$folder\\${names[$((6 * 4 + 1))]}" "$(title)"
+xdotool key Home
+
+xdotool mousemove $((X + 51)) $((Y + 55)) click 1
+xdotool mousemove $((view_x + 400)) $((view_y + 70)) click 1
+check "larger pictures: the third column now shows the second drawing" "$folder\\${names[1]}" "$(title)"
+
+# The caption under the first tile: double click, type, Enter.
+xdotool mousemove $((view_x + 60)) $((view_y + 179 + 12)) click --repeat 2 --delay 80 1 type "renamed.dwg"
+xdotool key Return
+sleep 1
+check "rename in place" "renamed.dwg" "$(ls "$work/drawings" | tr 'A-Z' 'a-z' | grep -x -e renamed.dwg -e "${names[0]}")"
+
+import -window root "$shots/view.png"
+mapfile -t names < <(ls "$work/drawings" | tr 'A-Z' 'a-z' | LC_ALL=C sort)
+xdotool mousemove $(tile 0) click --repeat 2 --delay 80 1
+for _ in $(seq 50); do
+  kill -0 "$host" 2>/dev/null || break
+  sleep 0.2
+done
+kill -0 "$host" 2>/dev/null && { kill "$host"; echo "FAILED: the host did not end after the double click"; failed=$((failed + 1)); }
+wait "$host"
+lower=$(echo "$folder" | tr 'A-Z' 'a-z')
+check "the double click accepts" "(\"${lower//\\/\\\\}\\\\${names[0]}\" (\"\" \"\" \"\"))" "$(tr -d '\r' <"$work/out")"
+
+echo "e2e view: $passed passed, $failed failed"
+[ "$failed" -eq 0 ]
