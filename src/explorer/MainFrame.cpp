@@ -68,6 +68,7 @@ int CMainFrame::OnCreate(CREATESTRUCTA *cs) {
   DockControlBar(&m_wndToolBar);
   m_wndToolBarBottom.EnableDocking(fw::CBRS_ALIGN_ANY);
   DockControlBar(&m_wndToolBarBottom);
+  m_bComplete = true;
   return 0;
 }
 
@@ -142,7 +143,7 @@ BOOL CMainFrame::OnCreateClient(CREATESTRUCTA *) {
 }
 
 void CMainFrame::OnDestroy() {
-  if (g_pDoc) {
+  if (g_pDoc && m_bComplete) {
     RECT window;
     GetWindowRect(&window);
     g_pDoc->m_nWindowWidth = window.right - window.left;
