@@ -3,6 +3,7 @@
 #include "app/CommandSession.h"
 #include "app/MainWindow.h"
 #include "app/Options.h"
+#include "lisp/Utf8.h"
 #include "runtime/TestApi.h"
 
 #include <windows.h>
@@ -37,12 +38,12 @@ std::wstring DefaultModulePath() {
   return folder + L"Lumvex1.arx";
 }
 
-void WriteStdout(const std::wstring &text) {
-  const int bytes = WideCharToMultiByte(CP_ACP, 0, text.data(), static_cast<int>(text.size()), nullptr, 0, nullptr, nullptr);
-  std::string narrow(static_cast<size_t>(bytes), '\0');
-  WideCharToMultiByte(CP_ACP, 0, text.data(), static_cast<int>(text.size()), narrow.data(), bytes, nullptr, nullptr);
-  std::fwrite(narrow.data(), 1, narrow.size(), stdout);
-  std::fflush(stdout);
+// Standard output and standard error carry UTF-8, whatever the ANSI code page, so that scripts
+// and terminals read every character.
+void Write(FILE *stream, const std::wstring &text) {
+  const std::string bytes = lisp::ToUtf8(text);
+  std::fwrite(bytes.data(), 1, bytes.size(), stream);
+  std::fflush(stream);
 }
 
 void ForwardPrinted(const wchar_t *text, void *session) { static_cast<CommandSession *>(session)->Write(text); }
@@ -81,10 +82,8 @@ int main() {
   _setmode(_fileno(stderr), _O_BINARY);
   const HostOptions options = ParseOptions(CommandLineArguments());
   if (!options.error.empty()) {
-    std::fprintf(
-        stderr,
-        "devhost: %ls\nusage: devhost [--batch] [--eval EXPR]... [--module PATH] [--drawings N] [--layers NAME=COLOUR;...]\n",
-        options.error.c_str());
+    Write(stderr, L"devhost: " + options.error +
+                      L"\nusage: devhost [--batch] [--eval EXPR]... [--module PATH] [--drawings N] [--layers NAME=COLOUR;...]\n");
     return kExitBadOptions;
   }
 
@@ -96,7 +95,7 @@ int main() {
   MainWindow window;
   CommandSession session([&window, &options](const std::wstring &text) {
     // The interactive command line is echoed on standard output too, for whoever started the host.
-    WriteStdout(text);
+    Write(stdout, text);
     if (!options.batch) window.AppendHistory(text);
   });
   devhostSetOutputSink(ForwardPrinted, &session);
@@ -119,7 +118,7 @@ int main() {
   const std::wstring modulePath = options.modulePath.empty() ? DefaultModulePath() : options.modulePath;
   const int loaded = devhostLoadModule(modulePath.c_str());
   if (loaded != kDevhostLoaded) {
-    std::fprintf(stderr, "devhost: cannot load %ls: %ls\n", modulePath.c_str(), LoadErrorText(loaded));
+    Write(stderr, L"devhost: cannot load " + modulePath + L": " + LoadErrorText(loaded) + L"\n");
     return kExitModuleNotLoaded;
   }
 

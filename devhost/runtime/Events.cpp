@@ -1,6 +1,7 @@
 #include "runtime/Events.h"
 
 #include "runtime/TestApi.h"
+#include "lisp/Utf8.h"
 
 #include <cstdio>
 #include <utility>
@@ -40,6 +41,6 @@ void devhostClearEvents() { Log().clear(); }
 void acdbFail(const ACHAR *message) {
   const std::wstring text = message ? message : L"";
   devhost::RecordEvent(kDevhostFail, text);
-  std::fprintf(stderr, "fail: %ls\n", text.c_str());
+  std::fprintf(stderr, "fail: %s\n", lisp::ToUtf8(text).c_str());
 }
 }

@@ -1,6 +1,7 @@
 // The command line and alert boxes.
 #include "runtime/Events.h"
 #include "runtime/HostState.h"
+#include "lisp/Utf8.h"
 
 #include <cstdarg>
 #include <cstdio>
@@ -23,20 +24,16 @@ std::wstring Format(const ACHAR *format, va_list args) {
   }
 }
 
+// One line of UTF-8, every newline written as "\n".
 std::string Escaped(const std::wstring &text) {
-  std::string line;
+  std::wstring line;
   for (wchar_t c : text) {
     if (c == L'\n')
-      line += "\\n";
-    else if (c < 0x80)
-      line += static_cast<char>(c);
-    else {
-      char bytes[8];
-      const int n = WideCharToMultiByte(CP_ACP, 0, &c, 1, bytes, sizeof bytes, nullptr, nullptr);
-      line.append(bytes, n > 0 ? n : 0);
-    }
+      line += L"\\n";
+    else
+      line += c;
   }
-  return line;
+  return lisp::ToUtf8(line);
 }
 }  // namespace
 

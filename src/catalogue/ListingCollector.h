@@ -1,10 +1,9 @@
 // Gathers the records of one folder scan before they enter the catalogue.
 //
-// The catalogue grows 100 records at a time, and a record cannot be moved, only copied (name
-// included), so adding a large folder's records one by one copies the array over and over:
-// a folder of 100,000 drawings took over half a minute
-// under Wine. The collector keeps the entries in a compact
-// form instead and hands them over with the array sized once.
+// The catalogue grows 100 records at a time, so adding a large folder's records one by one
+// moves the whole array again at every step, and each record holds a name of its own on the
+// heap. The collector keeps the entries in a compact form instead (all names in one string)
+// and hands them over with the array sized once.
 #pragma once
 
 #include "catalogue/DwgData.h"

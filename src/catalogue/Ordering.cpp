@@ -17,7 +17,8 @@ void SwapRecords(DwgData &a, DwgData &b) {
 }
 
 // order[i] is the index of the record that belongs at i. Each cycle of the permutation is
-// walked once, so every record is swapped into place without copying its name.
+// walked once, so every record is swapped into place, its name with it, and no record is
+// made or destroyed on the way.
 void ApplyOrder(DwgData *records, std::vector<int> &order) {
   const int count = static_cast<int>(order.size());
   for (int start = 0; start < count; ++start) {
@@ -93,7 +94,8 @@ void SortRecords(DwgCatalogue &catalogue, int sortKey) {
   if (sortKey == kSortByName) {
     order = OrderByName(records, count);
   } else if (sortKey == kSortByDate || sortKey == kSortBySize) {
-    // A record is copied, name and all, each time a sort moves it: indices are sorted instead.
+    // Small indices move faster than records with their names: indices are sorted, then the
+    // records are put in that order once.
     order.resize(static_cast<size_t>(count));
     std::iota(order.begin(), order.end(), 0);
     const auto compare = sortKey == kSortByDate ? CompareByDate : CompareBySize;

@@ -20,7 +20,12 @@ CDialogRun::~CDialogRun() {
 
 BOOL CDialogRun::OnInitDialog() {
   CDialog::OnInitDialog();
-  if (auto *app = dynamic_cast<CMdiMixin *>(fw::AfxGetApp())) app->CreateExplorerFrame(this);
+  auto *app = dynamic_cast<CMdiMixin *>(fw::AfxGetApp());
+  if (!app || !app->CreateExplorerFrame(this)) {
+    // No explorer to end the run later: the browse ends here, as cancelled.
+    EndDialog(2);
+    return TRUE;
+  }
   // The modal loop shows the dialog; at no size and at the corner nobody sees it.
   ::MoveWindow(m_hWnd, 0, 0, 0, 0, FALSE);
   SetDoubleClickTime(kDoubleClickMilliseconds);

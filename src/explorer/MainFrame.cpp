@@ -63,11 +63,9 @@ int CMainFrame::OnCreate(CREATESTRUCTA *cs) {
   if (!m_wndStatusBar.Create(this, WS_CHILD | WS_VISIBLE | fw::CBRS_BOTTOM, AFX_IDW_STATUS_BAR) ||
       !m_wndStatusBar.SetIndicators(kIndicators, static_cast<int>(sizeof kIndicators / sizeof kIndicators[0])))
     return -1;
-  m_wndToolBar.EnableDocking(fw::CBRS_ALIGN_ANY);
-  EnableDocking(fw::CBRS_ALIGN_ANY);
   DockControlBar(&m_wndToolBar);
-  m_wndToolBarBottom.EnableDocking(fw::CBRS_ALIGN_ANY);
   DockControlBar(&m_wndToolBarBottom);
+  m_bComplete = true;
   return 0;
 }
 
@@ -142,7 +140,7 @@ BOOL CMainFrame::OnCreateClient(CREATESTRUCTA *) {
 }
 
 void CMainFrame::OnDestroy() {
-  if (g_pDoc) {
+  if (g_pDoc && m_bComplete) {
     RECT window;
     GetWindowRect(&window);
     g_pDoc->m_nWindowWidth = window.right - window.left;

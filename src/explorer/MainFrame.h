@@ -48,6 +48,9 @@ class CMainFrame : public fw::CFrameWnd {
   bool OnSortCommand(int key, bool update, fw::CCmdUI *cmdUI);
   void EndBrowse(int code) const;
   void OpenHelp() const;
+
+  // Set once every window of the frame exists: a half-made frame leaves the document alone.
+  bool m_bComplete = false;
 };
 
 // The explorer frame while the explorer is open, or null.

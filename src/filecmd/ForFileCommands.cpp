@@ -10,12 +10,20 @@
 
 #include <functional>
 #include <string>
+#include <vector>
 
 namespace {
+// One path of the clipboard's file list. A wide list (the Windows shell writes those) is
+// converted to ANSI; a name with a character outside the code page has no exact ANSI form.
+struct ClipboardPath {
+  std::string ansi;
+  std::wstring wide;
+  bool exact = true;
+};
+
 // Hands each path of the clipboard's file list to visit, in order, until visit returns false.
-// A wide list (the Windows shell writes those) comes as ANSI text like a narrow one. False
-// when the clipboard cannot be read or offers no file list.
-bool ForEachClipboardPath(const std::function<bool(const std::string &)> &visit) {
+// False when the clipboard cannot be read or offers no file list.
+bool ForEachClipboardPath(const std::function<bool(const ClipboardPath &)> &visit) {
   fw::COleDataObject clipboard;
   if (!clipboard.AttachClipboard() || !clipboard.IsDataAvailable(CF_HDROP)) return false;
   const fw::CGlobalMemory block = clipboard.GetGlobalData(CF_HDROP);
@@ -23,39 +31,63 @@ bool ForEachClipboardPath(const std::function<bool(const std::string &)> &visit)
   const fw::CGlobalLock lock(block.get());
   if (!lock.Data()) return false;
   FileListReader reader(lock.Data(), lock.Size());
+  ClipboardPath path;
   if (reader.IsWide()) {
-    std::u16string wide;
-    while (reader.NextWide(wide)) {
-      if (!visit(ToAnsi(reinterpret_cast<const wchar_t *>(wide.c_str())))) break;
+    std::u16string units;
+    while (reader.NextWide(units)) {
+      path.wide.assign(units.begin(), units.end());
+      path.exact = ToAnsiExact(path.wide, path.ansi);
+      if (!visit(path)) break;
     }
   } else {
-    std::string narrow;
-    while (reader.NextNarrow(narrow)) {
-      if (!visit(narrow)) break;
+    while (reader.NextNarrow(path.ansi)) {
+      if (!visit(path)) break;
     }
   }
   return true;
+}
+
+// A name that does not convert exactly would reach the shell as another name, or as a
+// wildcard ("?" matches any character): the whole paste is refused and the user told which.
+void ReportUnpastable(const std::vector<std::wstring> &paths) {
+  std::wstring text =
+      L"Nothing was pasted. The names of these files contain characters that this "
+      L"system's code page cannot hold:\n";
+  for (const std::wstring &path : paths) text += L"\n" + path;
+  text += L"\n\nRename them and paste again.";
+  MessageBoxW(GetActiveWindow(), text.c_str(), L"Paste", MB_OK | MB_ICONWARNING);
 }
 }  // namespace
 
 bool ForFileCommands::CanPaste() {
   bool found = false;
-  ForEachClipboardPath([&found](const std::string &path) {
-    found = IsDwgPath(path.c_str());
+  ForEachClipboardPath([&found](const ClipboardPath &path) {
+    // A drawing whose name cannot be pasted still offers the paste, which then tells why not.
+    found = IsDwgPath((path.exact ? path.ansi : ToAnsi(path.wide.c_str())).c_str());
     return !found;
   });
   return found;
 }
 
 bool ForFileCommands::Paste() {
-  CShellFileOp operation;
-  const bool read = ForEachClipboardPath([&operation](const std::string &path) {
-    operation.AddFile(0, path.c_str());
+  std::vector<std::string> sources;
+  std::vector<std::wstring> unpastable;
+  const bool read = ForEachClipboardPath([&](const ClipboardPath &path) {
+    if (path.exact)
+      sources.push_back(path.ansi);
+    else
+      unpastable.push_back(path.wide);
     return true;
   });
+  if (!unpastable.empty()) {
+    ReportUnpastable(unpastable);
+    return false;
+  }
   char destination[MAX_PATH];
   const DWORD length = GetCurrentDirectoryA(MAX_PATH, destination);
   if (!read || length == 0 || length >= MAX_PATH) return false;
+  CShellFileOp operation;
+  for (const std::string &source : sources) operation.AddFile(0, source.c_str());
   operation.AddFile(1, destination);
   return operation.CopyFiles() == 0;
 }

@@ -11,7 +11,8 @@ class ForFileCommands {
   // True when the clipboard offers a file list holding at least one drawing.
   bool CanPaste();
   // Copies every file of the clipboard's list into the current directory through the shell;
-  // true when the shell reports success.
+  // true when the shell reports success. A list holding a name with no exact ANSI form is
+  // refused whole, and the user is told which files could not be pasted.
   bool Paste();
   // Renames through the shell and returns its result, 0 for success. The owner is not used.
   int RenameFile(const char *from, const char *to, HWND owner);

@@ -11,11 +11,8 @@
 namespace fw {
 
 // Bar styles, kept by the bar itself (not window styles).
-constexpr DWORD CBRS_ALIGN_LEFT = 0x1000;
 constexpr DWORD CBRS_ALIGN_TOP = 0x2000;
-constexpr DWORD CBRS_ALIGN_RIGHT = 0x4000;
 constexpr DWORD CBRS_ALIGN_BOTTOM = 0x8000;
-constexpr DWORD CBRS_ALIGN_ANY = 0xF000;
 constexpr DWORD CBRS_BORDER_LEFT = 0x0100;
 constexpr DWORD CBRS_BORDER_TOP = 0x0200;
 constexpr DWORD CBRS_BORDER_RIGHT = 0x0400;
@@ -31,9 +28,6 @@ constexpr DWORD CBRS_ALL = 0x0040FFFF;
 class CControlBar : public CWnd {
  public:
   DWORD GetBarStyle() const { return m_dwStyle; }
-  void SetBarStyle(DWORD style) { m_dwStyle = style & CBRS_ALL; }
-  void EnableDocking(DWORD sides) { m_dwDockStyle = sides & CBRS_ALIGN_ANY; }
-  DWORD GetDockStyle() const { return m_dwDockStyle; }
   virtual bool IsStatusBar() const { return false; }
   // The status bar shows menu and button prompts in its message pane; other bars ignore them.
   virtual void SetMessagePaneText(const std::string &text) { (void)text; }
@@ -51,7 +45,6 @@ class CControlBar : public CWnd {
   }
 
   DWORD m_dwStyle = 0;
-  DWORD m_dwDockStyle = 0;
 };
 
 }  // namespace fw

@@ -3,8 +3,6 @@
 #include "fw/FrameWnd.h"
 #include "fw/WinApp.h"
 
-#include <cstdlib>
-
 namespace fw {
 namespace {
 INT_PTR CALLBACK AfxDlgProc(HWND hwnd, UINT message, WPARAM, LPARAM) {
@@ -32,53 +30,17 @@ struct DialogTemplate {
 
 HWND CDataExchange::Control(int id) const { return ::GetDlgItem(m_pDlgWnd->m_hWnd, id); }
 
-void DDX_Text(CDataExchange *dx, int id, std::string &value) {
-  HWND control = dx->Control(id);
-  if (!control) return;
-  if (!dx->m_bSaveAndValidate) {
-    ::SetWindowTextA(control, value.c_str());
-    return;
-  }
-  const int length = ::GetWindowTextLengthA(control);
-  std::string text(static_cast<size_t>(length) + 1, '\0');
-  const int copied = ::GetWindowTextA(control, text.data(), length + 1);
-  text.resize(static_cast<size_t>(copied > 0 ? copied : 0));
-  value = text;
-}
-
-void DDX_Text(CDataExchange *dx, int id, int &value) {
-  std::string text = std::to_string(value);
-  DDX_Text(dx, id, text);
-  if (!dx->m_bSaveAndValidate) return;
-  char *end = nullptr;
-  const long number = std::strtol(text.c_str(), &end, 10);
-  if (text.empty() || (end && *end)) {
-    dx->m_bFailed = true;
-    ::MessageBoxA(dx->m_pDlgWnd->m_hWnd, "Please enter an integer.", nullptr, MB_OK | MB_ICONEXCLAMATION);
-    ::SetFocus(dx->Control(id));
-    return;
-  }
-  value = static_cast<int>(number);
-}
-
 void DDX_Control(CDataExchange *dx, int id, CWnd &control) {
   if (!control.m_hWnd) control.SubclassWindow(dx->Control(id));
 }
 
-BOOL CDialog::UpdateData(BOOL saveAndValidate) {
-  CDataExchange dx(this, saveAndValidate);
-  DoDataExchange(&dx);
-  return !dx.m_bFailed;
-}
-
 BOOL CDialog::OnInitDialog() {
-  UpdateData(FALSE);
+  CDataExchange dx(this);
+  DoDataExchange(&dx);
   return TRUE;
 }
 
-void CDialog::OnOK() {
-  if (UpdateData(TRUE)) EndDialog(IDOK);
-}
+void CDialog::OnOK() { EndDialog(IDOK); }
 
 void CDialog::OnCancel() { EndDialog(IDCANCEL); }
 

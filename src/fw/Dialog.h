@@ -1,28 +1,24 @@
-// Dialogs from resource templates: data exchange with their controls, and the modal run with
-// its own message loop (PreTranslateMessage from the target window up, idle updates of frames).
+// Dialogs from resource templates: their controls bound to member objects when they open, and
+// the modal run with its own message loop (PreTranslateMessage from the target window up, idle
+// updates of frames).
 #pragma once
 
 #include "fw/Wnd.h"
-
-#include <string>
 
 namespace fw {
 
 class CDialog;
 
-// One transfer between a dialog's members and its controls.
+// The binding of a dialog's controls to its members, done when the dialog opens.
 class CDataExchange {
  public:
-  CDataExchange(CDialog *dialog, BOOL saveAndValidate) : m_pDlgWnd(dialog), m_bSaveAndValidate(saveAndValidate) {}
+  explicit CDataExchange(CDialog *dialog) : m_pDlgWnd(dialog) {}
   HWND Control(int id) const;
 
   CDialog *m_pDlgWnd;
-  BOOL m_bSaveAndValidate;
-  bool m_bFailed = false;
 };
 
-void DDX_Text(CDataExchange *dx, int id, std::string &value);
-void DDX_Text(CDataExchange *dx, int id, int &value);
+// Attaches the control object to the dialog's control with that id.
 void DDX_Control(CDataExchange *dx, int id, CWnd &control);
 
 class CDialog : public CWnd {
@@ -33,11 +29,11 @@ class CDialog : public CWnd {
   virtual INT_PTR DoModal();
   void EndDialog(int result);
 
+  // The base binds the controls (DoDataExchange).
   virtual BOOL OnInitDialog();
   virtual void OnOK();
   virtual void OnCancel();
   virtual void DoDataExchange(CDataExchange *dx) { (void)dx; }
-  BOOL UpdateData(BOOL saveAndValidate = TRUE);
 
   BOOL PreTranslateMessage(MSG *msg) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;

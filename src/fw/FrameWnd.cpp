@@ -10,15 +10,15 @@ namespace fw {
 namespace {
 constexpr char kIdleFallback[] = "Ready";
 
-LPCSTR FrameClassName(UINT resourceId, HINSTANCE resources) {
-  static std::string name;
-  name = "FwFrame" + std::to_string(resourceId);
+// The frame class of a resource id, registered on this module the first time it is asked for.
+std::string FrameClassName(UINT resourceId, HINSTANCE resources) {
+  const std::string name = "FwFrame" + std::to_string(resourceId);
   WNDCLASSEXA wc{};
   wc.cbSize = sizeof wc;
-  if (GetClassInfoExA(GetModuleHandleA(nullptr), name.c_str(), &wc)) return name.c_str();
+  if (GetClassInfoExA(AfxGetInstanceHandle(), name.c_str(), &wc)) return name;
   wc.style = CS_DBLCLKS;
   wc.lpfnWndProc = ::DefWindowProcA;
-  wc.hInstance = GetModuleHandleA(nullptr);
+  wc.hInstance = AfxGetInstanceHandle();
   wc.hCursor = LoadCursor(nullptr, IDC_ARROW);
   wc.hbrBackground = reinterpret_cast<HBRUSH>(COLOR_BTNFACE + 1);
   wc.hIcon = static_cast<HICON>(LoadImageA(resources, MAKEINTRESOURCEA(resourceId), IMAGE_ICON, GetSystemMetrics(SM_CXICON),
@@ -27,7 +27,7 @@ LPCSTR FrameClassName(UINT resourceId, HINSTANCE resources) {
                                              GetSystemMetrics(SM_CYSMICON), LR_SHARED));
   wc.lpszClassName = name.c_str();
   RegisterClassExA(&wc);
-  return name.c_str();
+  return name;
 }
 
 std::string FirstPart(const std::string &text) { return text.substr(0, text.find('\n')); }
@@ -41,8 +41,9 @@ BOOL CFrameWnd::LoadFrame(UINT resourceId, DWORD style, CWnd *owner) {
   m_strTitle = FirstPart(AfxLoadString(resourceId));
   m_hAccelTable = LoadAcceleratorsA(resources, MAKEINTRESOURCEA(resourceId));
 
+  const std::string className = FrameClassName(resourceId, resources);
   CREATESTRUCTA cs{};
-  cs.lpszClass = FrameClassName(resourceId, resources);
+  cs.lpszClass = className.c_str();
   cs.lpszName = m_strTitle.c_str();
   cs.style = static_cast<LONG>(style & ~FWS_ADDTOTITLE);
   cs.x = cs.y = cs.cx = cs.cy = CW_USEDEFAULT;
@@ -145,7 +146,6 @@ void CFrameWnd::SetMessageText(const std::string &text) {
 void CFrameWnd::SetMessageText(UINT stringId) {
   std::string prompt = FirstPart(AfxLoadString(stringId));
   if (prompt.empty() && stringId == AFX_IDS_IDLEMESSAGE) prompt = kIdleFallback;
-  m_bPromptShown = stringId != AFX_IDS_IDLEMESSAGE;
   SetMessageText(prompt);
 }
 

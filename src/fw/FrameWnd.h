@@ -42,8 +42,7 @@ class CFrameWnd : public CWnd {
   // The first docked bar with that child id, or the status bar for AFX_IDW_STATUS_BAR.
   CControlBar *GetControlBar(UINT id) const;
   void ShowControlBar(CControlBar *bar, BOOL show);
-  // Allows docking on the given sides; bars stay along the edge their style names.
-  void EnableDocking(DWORD sides) { m_dwDockSides = sides & CBRS_ALIGN_ANY; }
+  // Takes the bar into the layout, along the edge its style names.
   void DockControlBar(CControlBar *bar);
 
   // Idle processing: update handlers of the bars' items, "Ready" when no prompt is showing.
@@ -75,8 +74,6 @@ class CFrameWnd : public CWnd {
   CWnd *m_pActiveView = nullptr;
   std::vector<CControlBar *> m_dockedBars;  // in docking order
   std::string m_strTitle;
-  DWORD m_dwDockSides = 0;
-  bool m_bPromptShown = false;
 };
 
 }  // namespace fw

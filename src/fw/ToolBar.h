@@ -17,7 +17,6 @@ namespace fw {
 
 constexpr UINT TBBS_BUTTON = TBSTYLE_BUTTON;
 constexpr UINT TBBS_SEPARATOR = TBSTYLE_SEP;
-constexpr UINT TBBS_CHECKBOX = TBSTYLE_CHECK;
 
 class CToolBar : public CControlBar {
  public:
@@ -49,7 +48,6 @@ class CToolBar : public CControlBar {
     return static_cast<BOOL>(SendMessage(TB_ENABLEBUTTON, id, MAKELPARAM(enable ? TRUE : FALSE, 0)));
   }
   BOOL IsButtonEnabled(UINT id) const { return static_cast<BOOL>(SendMessage(TB_ISBUTTONENABLED, id)); }
-  BOOL IsButtonChecked(UINT id) const { return static_cast<BOOL>(SendMessage(TB_ISBUTTONCHECKED, id)); }
   HWND GetToolTips() const { return reinterpret_cast<HWND>(SendMessage(TB_GETTOOLTIPS)); }
 
   SIZE CalcFixedLayout(BOOL stretch, BOOL horizontal) override;

@@ -1,6 +1,7 @@
 #include "fw/View.h"
 
 #include "fw/FrameWnd.h"
+#include "fw/WinApp.h"
 
 #include <algorithm>
 #include <climits>
@@ -41,7 +42,7 @@ BOOL CView::Create(LPCSTR className, LPCSTR windowName, DWORD style, const RECT 
   cs.cy = rect.bottom - rect.top;
   cs.hwndParent = parent ? parent->m_hWnd : nullptr;
   cs.hMenu = reinterpret_cast<HMENU>(static_cast<UINT_PTR>(id));
-  cs.hInstance = ::GetModuleHandleA(nullptr);
+  cs.hInstance = AfxGetInstanceHandle();
   if (!PreCreateWindow(cs)) return FALSE;
   return CreateFromStruct(cs);
 }

@@ -1,6 +1,7 @@
-// Views: the pane windows of a frame. A view paints through OnDraw, is told when the frame
-// makes it the active view, and asks its frame to activate it when it is clicked. Views are
-// owned by whoever created them (the splitter for its panes); they do not delete themselves.
+// Views: the pane windows of a frame. A view paints and prints through OnDraw, is told when
+// the frame makes it the active view, and asks its frame to activate it when it is clicked.
+// Views are owned by whoever created them (the splitter for its panes); they do not delete
+// themselves.
 #pragma once
 
 #include "fw/Wnd.h"
@@ -29,7 +30,13 @@ class CView : public CWnd {
   // The nearest enclosing frame window, or null.
   CFrameWnd *GetParentFrame() const;
 
+  // The print commands (the frame routes them to its active view): the view printed on one
+  // page, after the print dialog or, for the direct command, on the default printer.
+  BOOL OnCmdMsg(UINT id, int code, CCmdUI *cmdUI) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
+
+ protected:
+  void OnFilePrint(bool direct);
 
  private:
   LRESULT OnMouseActivate();

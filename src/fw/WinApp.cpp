@@ -1,5 +1,7 @@
 #include "fw/WinApp.h"
 
+extern "C" IMAGE_DOS_HEADER __ImageBase;  // the linker's name for this module's base
+
 namespace fw {
 namespace {
 CWinApp *g_application = nullptr;
@@ -13,6 +15,8 @@ CWinApp::~CWinApp() {
 }
 
 CWinApp *AfxGetApp() { return g_application; }
+
+HINSTANCE AfxGetInstanceHandle() { return reinterpret_cast<HINSTANCE>(&__ImageBase); }
 
 HINSTANCE AfxGetResourceHandle() { return g_resourceHandle; }
 

@@ -25,6 +25,9 @@ class CWinApp {
 };
 
 CWinApp *AfxGetApp();
+// The module this layer is linked into: its window classes are registered there, so that two
+// modules using the layer, or two copies of one module, never share or replace a class.
+HINSTANCE AfxGetInstanceHandle();
 // The module whose dialogs, menus and strings are loaded.
 HINSTANCE AfxGetResourceHandle();
 void AfxSetResourceHandle(HINSTANCE instance);

@@ -1,5 +1,7 @@
 #include "fw/Wnd.h"
 
+#include "fw/WinApp.h"
+
 #include <unordered_map>
 
 namespace fw {
@@ -13,16 +15,28 @@ std::unordered_map<HWND, CWnd *> &HandleMap() {
 thread_local CWnd *t_creating = nullptr;
 thread_local HHOOK t_cbtHook = nullptr;
 
-struct HookScope {
-  HookScope(CWnd *wnd) {
+// A window made while another is being created (a frame's bars inside its WM_CREATE) has a
+// scope of its own inside the outer one: each scope removes its own hook and gives the outer
+// one back.
+class HookScope {
+ public:
+  explicit HookScope(CWnd *wnd) : m_previousCreating(t_creating), m_previousHook(t_cbtHook) {
     t_creating = wnd;
-    t_cbtHook = SetWindowsHookExA(WH_CBT, AfxCbtHook, nullptr, GetCurrentThreadId());
+    m_hook = SetWindowsHookExA(WH_CBT, AfxCbtHook, nullptr, GetCurrentThreadId());
+    t_cbtHook = m_hook;
   }
   ~HookScope() {
-    if (t_cbtHook) UnhookWindowsHookEx(t_cbtHook);
-    t_cbtHook = nullptr;
-    t_creating = nullptr;
+    if (m_hook) UnhookWindowsHookEx(m_hook);
+    t_cbtHook = m_previousHook;
+    t_creating = m_previousCreating;
   }
+  HookScope(const HookScope &) = delete;
+  HookScope &operator=(const HookScope &) = delete;
+
+ private:
+  CWnd *m_previousCreating;
+  HHOOK m_previousHook;
+  HHOOK m_hook;
 };
 
 bool IsReflected(UINT message) {
@@ -82,7 +96,7 @@ LPCSTR AfxWndClassName() {
     WNDCLASSA wc{};
     wc.style = CS_DBLCLKS;
     wc.lpfnWndProc = ::DefWindowProcA;
-    wc.hInstance = GetModuleHandleA(nullptr);
+    wc.hInstance = AfxGetInstanceHandle();
     wc.hCursor = LoadCursor(nullptr, IDC_ARROW);
     wc.lpszClassName = kName;
     return RegisterClassA(&wc);
@@ -148,8 +162,8 @@ BOOL CWnd::CreateFromStruct(const CREATESTRUCTA &cs) {
     static HWND Create(void *context) {
       const CREATESTRUCTA &c = static_cast<Call *>(context)->cs;
       return ::CreateWindowExA(c.dwExStyle, c.lpszClass ? c.lpszClass : AfxWndClassName(), c.lpszName,
-                               static_cast<DWORD>(c.style), c.x, c.y, c.cx, c.cy, c.hwndParent, c.hMenu,
-                               GetModuleHandleA(nullptr), c.lpCreateParams);
+                               static_cast<DWORD>(c.style), c.x, c.y, c.cx, c.cy, c.hwndParent, c.hMenu, AfxGetInstanceHandle(),
+                               c.lpCreateParams);
     }
   } call{cs};
   return CreateAttached(Call::Create, &call) != nullptr;

@@ -106,7 +106,7 @@ class CWnd {
 LRESULT CALLBACK AfxWndProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam);
 // Attaches the object being created to its window before the window's first message.
 LRESULT CALLBACK AfxCbtHook(int code, WPARAM wParam, LPARAM lParam);
-// The window class every framework window of our own uses (registered once per module).
+// The window class every framework window of our own uses, registered on this module.
 LPCSTR AfxWndClassName();
 
 }  // namespace fw

@@ -3,6 +3,7 @@
 namespace {
 constexpr const ACHAR *kMissing = L"\nMissing parametrs\n";
 constexpr const ACHAR *kWrongType = L"\nArgument should be an short";
+constexpr short kSignature[] = {RTSHORT, RTSHORT, RTSTR, RTSTR, RTSTR};
 
 void CopyCut(const ACHAR *text, LumvexText out) {
   if (!out.buffer || out.capacity == 0) return;
@@ -11,45 +12,45 @@ void CopyCut(const ACHAR *text, LumvexText out) {
   out.buffer[i] = 0;
 }
 
-bool Report(const ACHAR *message) {
-  acutPrintf(message);
-  acedAlert(message);
+// The first argument's wrong type is told in the order print, alert, release; a later one's
+// in the order release, alert, print, as callers have always seen them.
+bool ReportWrongType(size_t position, resbuf *args) {
+  if (position == 0) {
+    acutPrintf(kWrongType);
+    acedAlert(kWrongType);
+    acutRelRb(args);
+  } else {
+    acutRelRb(args);
+    acedAlert(kWrongType);
+    acutPrintf(kWrongType);
+  }
+  return false;
+}
+
+bool ReportMissing(resbuf *args) {
+  acutPrintf(kMissing);
+  acedAlert(kMissing);
+  if (args) acutRelRb(args);
   return false;
 }
 }  // namespace
 
 bool ReadLumvexArgs(int &a, int &b, LumvexText s1, LumvexText s2, LumvexText s3) {
   resbuf *args = acedGetArgs();
-  if (!args) return Report(kMissing);
-
-  if (args->restype != RTSHORT) {
-    Report(kWrongType);
-    acutRelRb(args);
-    return false;
+  // Argument by argument, present and then of its type: the first failing check decides.
+  const resbuf *found[5] = {};
+  const resbuf *node = args;
+  for (size_t i = 0; i < 5; ++i, node = node->rbnext) {
+    if (!node) return ReportMissing(args);
+    if (node->restype != kSignature[i]) return ReportWrongType(i, args);
+    found[i] = node;
   }
 
-  const resbuf *second = args->rbnext;
-  const resbuf *third = second ? second->rbnext : nullptr;
-  const resbuf *fourth = third ? third->rbnext : nullptr;
-  const resbuf *fifth = fourth ? fourth->rbnext : nullptr;
-  if (!fifth) {
-    Report(kMissing);
-    acutRelRb(args);
-    return false;
-  }
-
-  if (second->restype != RTSHORT || third->restype != RTSTR || fourth->restype != RTSTR || fifth->restype != RTSTR) {
-    acutRelRb(args);
-    acedAlert(kWrongType);
-    acutPrintf(kWrongType);
-    return false;
-  }
-
-  a = args->resval.rint;
-  b = second->resval.rint;
-  CopyCut(third->resval.rstring, s1);
-  CopyCut(fourth->resval.rstring, s2);
-  CopyCut(fifth->resval.rstring, s3);
+  a = found[0]->resval.rint;
+  b = found[1]->resval.rint;
+  CopyCut(found[2]->resval.rstring, s1);
+  CopyCut(found[3]->resval.rstring, s2);
+  CopyCut(found[4]->resval.rstring, s3);
   acutRelRb(args);
   return true;
 }

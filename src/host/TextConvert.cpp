@@ -12,6 +12,19 @@ std::string ToAnsi(const wchar_t *text) {
   return result;
 }
 
+bool ToAnsiExact(const std::wstring &text, std::string &out) {
+  out.clear();
+  if (text.empty()) return true;
+  const int length = static_cast<int>(text.size());
+  BOOL usedDefault = FALSE;
+  const int bytes = WideCharToMultiByte(CP_ACP, WC_NO_BEST_FIT_CHARS, text.data(), length, nullptr, 0, nullptr, &usedDefault);
+  if (bytes <= 0 || usedDefault) return false;
+  out.resize(static_cast<size_t>(bytes));
+  WideCharToMultiByte(CP_ACP, WC_NO_BEST_FIT_CHARS, text.data(), length, out.data(), bytes, nullptr, &usedDefault);
+  // The way back must give the same text: only then does the ANSI name name the same file.
+  return !usedDefault && ToWide(out.c_str()) == text;
+}
+
 std::wstring ToWide(const char *text) {
   if (!text || !*text) return std::wstring();
   const int chars = MultiByteToWideChar(CP_ACP, 0, text, -1, nullptr, 0);

@@ -5,6 +5,9 @@
 #include <string>
 
 std::string ToAnsi(const wchar_t *text);
+// The ANSI text that stands for exactly this wide text: false when some character has no
+// equivalent in the code page (no best-fit look-alike, no "?" in its place).
+bool ToAnsiExact(const std::wstring &text, std::string &out);
 std::wstring ToWide(const char *text);
 // Copies as much of the text as fits the buffer with its terminator, never splitting a
 // double-byte character.

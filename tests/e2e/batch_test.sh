@@ -58,6 +58,13 @@ check "well-typed calls alert nothing" "" "$(alerts)"
 host --batch --eval '(setq x (list 1 2.5 "a\\b" (list "c")))' --eval '(cadr x)'
 check "setq and cadr" $'(1 2.5 "a\\\\b" ("c"))\n2.5' "$(cat "$work/out")"
 
+# Text outside ASCII leaves as UTF-8 on both streams, whatever the ANSI code page.
+host --batch --module 'C:\nö\such.arx'
+check "UTF-8 on standard error" 'devhost: cannot load C:\nö\such.arx: the file is missing or is not a loadable module' \
+  "$(cat "$work/err")"
+host --batch --eval '(princ "ä")' --eval '(list "é" "図")'
+check "UTF-8 on standard output" $'ä\n"ä"\n("é" "図")' "$(cat "$work/out")"
+
 host --batch --eval '(car (list 1' --eval '(foo 1)' --eval '"still here"'
 check "errors are reported and evaluation goes on" \
   $'; error: malformed list on input\n; error: no function definition: FOO\n"still here"' "$(cat "$work/out")"

@@ -73,6 +73,16 @@ TEST_F(ArgumentCheck, WrongTypeAtAnyLaterPositionReleasesFirstThenAlertsThenPrin
   EXPECT_EQ(devhostResultKind(), RTNONE);
 }
 
+TEST_F(ArgumentCheck, ArgumentsAreCheckedOneByOneSoAnEarlierWrongTypeBeatsALaterGap) {
+  const std::vector<HostEvent> wrongType{Released(2), Alerted(kWrongType), Printed(kWrongType)};
+  EXPECT_EQ(Call(acutBuildList(RTSHORT, 0, RTSTR, L"x", 0)), wrongType);
+  EXPECT_EQ(Call(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSHORT, 1, 0)),
+            (std::vector<HostEvent>{Released(3), Alerted(kWrongType), Printed(kWrongType)}));
+  EXPECT_EQ(Call(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"a", 0)),
+            (std::vector<HostEvent>{Printed(kMissing), Alerted(kMissing), Released(3)}));
+  EXPECT_EQ(devhostResultKind(), RTNONE);
+}
+
 TEST_F(ArgumentCheck, WellTypedCallReleasesItsArgumentsAndGivesNilWhenCancelled) {
   EXPECT_EQ(CallAndCancel(acutBuildList(RTSHORT, 0, RTSHORT, -3, RTSTR, L"", RTSTR, L"", RTSTR, L"", 0)),
             (std::vector<HostEvent>{Released(5)}));

@@ -1,5 +1,4 @@
 target_sources(CatalogueScanTest PRIVATE
   ${CMAKE_SOURCE_DIR}/src/catalogue/FolderScan.cpp
   ${CMAKE_SOURCE_DIR}/src/catalogue/Ombra3Doc.cpp
-  ${CMAKE_SOURCE_DIR}/src/fw/Document.cpp
   ${CMAKE_SOURCE_DIR}/src/host/ModuleGlobals.cpp)

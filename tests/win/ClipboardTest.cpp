@@ -1,5 +1,6 @@
 // The file list on the real OLE clipboard: the view's copy read back by another process, and
 // paste of lists written as this program and as the Windows shell write them.
+#include "DialogAnswerer.h"
 #include "ScratchFolder.h"
 #include "filecmd/ForFileCommands.h"
 #include "filecmd/SelectionCommands.h"
@@ -9,6 +10,7 @@
 #include <ole2.h>
 #include <shlobj.h>
 
+#include <algorithm>
 #include <cstring>
 #include <filesystem>
 #include <fstream>
@@ -199,6 +201,41 @@ TEST(ClipboardPaste, WideListFromTheShellIsReadAsAnsiPaths) {
   EXPECT_TRUE(commands.Paste());
   EXPECT_EQ(Content(target.File("pl\xE4n.dwg")), "plan");
   EXPECT_EQ(Content(target.File("notes.txt")), "notes");
+}
+
+// A name outside the code page has no exact ANSI form: converted anyway, "図" would become the
+// wildcard "?" and "plān" the other file "plan". Such a paste is refused as a whole, and the
+// user is told which files could not be pasted.
+TEST(ClipboardPaste, NamesOutsideTheCodePageRefuseThePasteAndAreNamed) {
+  struct Row {
+    std::vector<std::wstring> listed;
+    std::vector<std::wstring> unpastable;
+  };
+  const std::vector<Row> rows{
+      {{L"\u56f3.dwg"}, {L"\u56f3.dwg"}},
+      {{L"pl\u0101n.dwg"}, {L"pl\u0101n.dwg"}},
+      {{L"notes.txt", L"pl\u0101n.dwg", L"\u56f3.dwg"}, {L"pl\u0101n.dwg", L"\u56f3.dwg"}},
+  };
+  ScratchFolder source("codepage-source"), target("codepage-target");
+  const std::wstring folder = fs::path(source.Path()).wstring() + L"\\";
+  for (const wchar_t *name : {L"a.dwg", L"plan.dwg", L"notes.txt", L"\u56f3.dwg", L"pl\u0101n.dwg"})
+    std::ofstream(fs::path(folder + name)) << "x";
+  CurrentDirectory here(target.Path());
+  for (const Row &row : rows) {
+    std::vector<std::wstring> paths;
+    for (const std::wstring &name : row.listed) paths.push_back(folder + name);
+    PutOnClipboard(CF_HDROP, WideList(paths));
+    DialogAnswerer ok(IDOK);
+    EXPECT_FALSE(ForFileCommands().Paste());
+    EXPECT_EQ(ok.Caption(), "Paste");
+    const std::wstring message = ok.Text();
+    for (const std::wstring &name : row.listed) {
+      const bool named = message.find(folder + name) != std::wstring::npos;
+      EXPECT_EQ(named, std::count(row.unpastable.begin(), row.unpastable.end(), name) == 1)
+          << std::string(name.begin(), name.end());
+    }
+    EXPECT_TRUE(fs::is_empty(target.Path())) << "nothing is pasted";
+  }
 }
 
 TEST(ClipboardPaste, BrokenOrMissingListPastesNothing) {

@@ -1,5 +1,6 @@
 // Delete to the recycle bin and rename, through the real shell: its confirmation is answered
 // by a watcher that finds the dialog and presses a button, as a person would.
+#include "DialogAnswerer.h"
 #include "ScratchFolder.h"
 #include "filecmd/ForFileCommands.h"
 #include "filecmd/SelectionCommands.h"
@@ -7,12 +8,10 @@
 
 #include <gtest/gtest.h>
 
-#include <atomic>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <string>
-#include <thread>
 
 namespace {
 namespace fs = std::filesystem;
@@ -36,61 +35,6 @@ void RemoveFromTrash(const std::string &name) {
   fs::remove(TrashFiles() / name, ignored);
   fs::remove(TrashFiles().parent_path() / "info" / (name + ".trashinfo"), ignored);
 }
-
-// Waits on its own thread for a dialog of this process that has the button, and presses it.
-class DialogAnswerer {
- public:
-  explicit DialogAnswerer(int buttonId) : m_nButton(buttonId), m_thread([this] { Watch(); }) {}
-  ~DialogAnswerer() { Caption(); }
-  DialogAnswerer(const DialogAnswerer &) = delete;
-  DialogAnswerer &operator=(const DialogAnswerer &) = delete;
-
-  // Caption of the dialog answered, empty while none was.
-  std::string Caption() {
-    m_bStop = true;
-    if (m_thread.joinable()) m_thread.join();
-    return m_caption;
-  }
-
- private:
-  struct Search {
-    int button;
-    HWND found;
-  };
-
-  static BOOL CALLBACK Match(HWND window, LPARAM param) {
-    auto *search = reinterpret_cast<Search *>(param);
-    DWORD process = 0;
-    GetWindowThreadProcessId(window, &process);
-    char className[32] = "";
-    GetClassNameA(window, className, sizeof className);
-    if (process != GetCurrentProcessId() || std::string(className) != "#32770" || !IsWindowVisible(window) ||
-        !GetDlgItem(window, search->button))
-      return TRUE;
-    search->found = window;
-    return FALSE;
-  }
-
-  void Watch() {
-    for (int tries = 0; tries < 300 && !m_bStop; ++tries) {
-      Search search{m_nButton, nullptr};
-      EnumWindows(Match, reinterpret_cast<LPARAM>(&search));
-      if (search.found) {
-        char caption[256] = "";
-        GetWindowTextA(search.found, caption, sizeof caption);
-        m_caption = caption;
-        SendMessageA(GetDlgItem(search.found, m_nButton), BM_CLICK, 0, 0);
-        return;
-      }
-      Sleep(50);
-    }
-  }
-
-  int m_nButton;
-  std::string m_caption;
-  std::atomic<bool> m_bStop{false};
-  std::thread m_thread;
-};
 
 constexpr int kYes = 6;
 constexpr int kNo = 7;

@@ -18,8 +18,6 @@ std::string ListBytes(const CShellFileOp &operation, int which) {
   return list ? std::string(list, static_cast<size_t>(operation.GetListSize(which))) : std::string();
 }
 
-// A folder of its own under the temporary folder, removed with everything in it.
-
 TEST(ShellFileOp, EachPathGrowsTheListByExactlyWhatItNeeds) {
   CShellFileOp operation;
   EXPECT_EQ(operation.GetOperation().pFrom, nullptr);
