@@ -29,15 +29,9 @@ class TSharedObject {
   TSharedObject &operator=(const TSharedObject &) = delete;
 
   T *Get() const { return m_pObject; }
-  operator T *() const { return m_pObject; }
   void Reset(T *object) {
     if (m_pObject && m_pObject != object && m_malloc.Get()) m_malloc.Get()->Free(m_pObject);
     m_pObject = object;
-  }
-  T *Detach() {
-    T *object = m_pObject;
-    m_pObject = nullptr;
-    return object;
   }
 
  private:

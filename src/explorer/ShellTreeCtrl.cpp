@@ -196,6 +196,10 @@ BOOL CShellTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, L
       case TVN_DELETEITEMW: delete reinterpret_cast<ShellItemData *>(tree->itemOld.lParam); break;
       case TVN_SELCHANGINGA:
       case TVN_SELCHANGINGW:
+        // Given the focus with nothing selected, the tree selects its first item by itself: no
+        // folder is scanned until the person, or the start path, chooses one.
+        *result = tree->action == TVC_UNKNOWN && !tree->itemOld.hItem && tree->itemNew.hItem != GetStartItem();
+        return TRUE;
       case TVN_KEYDOWN:
       case NM_SETFOCUS:
       case NM_KILLFOCUS: break;
@@ -227,7 +231,8 @@ void CShellTreeCtrl::ShowFolderSettingsMenu() {
   // The clicked item is the one the menu is for. Some tree controls leave the drop highlight
   // where it was during a right click: the click's own position decides then.
   const DWORD position = GetMessagePos();
-  TVHITTESTINFO hit{{static_cast<short>(LOWORD(position)), static_cast<short>(HIWORD(position))}};
+  TVHITTESTINFO hit{};
+  hit.pt = POINT{static_cast<short>(LOWORD(position)), static_cast<short>(HIWORD(position))};
   ScreenToClient(m_hWnd, &hit.pt);
   if (HitTest(&hit) && (hit.flags & TVHT_ONITEM)) Select(hit.hItem, TVGN_DROPHILITE);
   RunFolderSettingsMenu(GetDropHilightItem());

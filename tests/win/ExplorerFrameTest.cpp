@@ -232,7 +232,7 @@ TEST_F(ExplorerFrame, EscapeInAPaneCancels) {
   const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
     HWND splitter = GetDlgItem(frame, 0xE900);
     HWND left = GetDlgItem(splitter, 0xE900);
-    PostMessageA(left, WM_KEYDOWN, VK_ESCAPE, 0);
+    PostMessageA(GetWindow(left, GW_CHILD), WM_KEYDOWN, VK_ESCAPE, 0);  // the folder tree
   });
   EXPECT_EQ(outcome.resultKind, RTNIL);
 }

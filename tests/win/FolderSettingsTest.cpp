@@ -161,7 +161,9 @@ TEST_F(FolderSettings, DialogRulesAndTheBrowseResult) {
     EXPECT_EQ(file.GetString("Default Parameters", "Layer"), c.layer);
     EXPECT_EQ(file.GetString("Default Parameters", "Lisp command"), c.command);
     EXPECT_EQ(file.GetString("Default Parameters", "Color"), c.color);
-    if (c.file == kWallsWithOther) EXPECT_EQ(file.GetString("Other", "Key"), "kept");
+    if (c.file == kWallsWithOther) {
+      EXPECT_EQ(file.GetString("Other", "Key"), "kept");
+    }
   }
 }
 }  // namespace

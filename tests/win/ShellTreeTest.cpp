@@ -45,9 +45,10 @@ TEST_F(ShellTree, TheDesktopIsTheSingleRootAndTabLeavesForTheViewEscapeCancels) 
     HWND tree = FindTree(frame);
     roots = ChildTexts(tree, nullptr);
     PostMessageA(tree, WM_KEYDOWN, VK_TAB, 0);
-    SendMessageA(tree, WM_NULL, 0, 0);
-    GUITHREADINFO focus{sizeof focus};
-    GetGUIThreadInfo(GetWindowThreadProcessId(tree, nullptr), &focus);
+    GUITHREADINFO focus{};
+    focus.cbSize = sizeof focus;
+    for (int i = 0; i < 50 && (focus.hwndFocus == nullptr || focus.hwndFocus == tree); ++i, Sleep(20))
+      GetGUIThreadInfo(GetWindowThreadProcessId(tree, nullptr), &focus);
     focusAfterTab = focus.hwndFocus == tree                                                                          ? "tree"
                     : focus.hwndFocus != GetParent(tree) && GetParent(focus.hwndFocus) == GetParent(GetParent(tree)) ? "pane"
                                                                                                                      : "?";
@@ -80,7 +81,9 @@ TEST_F(ShellTree, OpensAlongTheStartFolderInAnyCaseThenAlongTheRememberedPath) {
       children = ChildTexts(tree, caret);
       HTREEITEM empty = ChildNamed(tree, caret, "A");
       SendMessageA(tree, TVM_EXPAND, TVE_EXPAND, reinterpret_cast<LPARAM>(empty));
-      TVITEMA button{TVIF_CHILDREN, empty};
+      TVITEMA button{};
+      button.mask = TVIF_CHILDREN;
+      button.hItem = empty;
       SendMessageA(tree, TVM_GETITEMA, 0, reinterpret_cast<LPARAM>(&button));
       emptyButton = std::to_string(button.cChildren);
       PostMessageA(frame, WM_CLOSE, 0, 0);

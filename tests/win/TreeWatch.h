@@ -4,6 +4,7 @@
 
 #include "ExplorerHarness.h"
 
+#include <cstring>
 #include <string>
 #include <vector>
 
@@ -28,7 +29,9 @@ inline HTREEITEM TreeNext(HWND tree, HTREEITEM item, UINT code) {
 
 inline std::string ItemText(HWND tree, HTREEITEM item) {
   char text[MAX_PATH] = "";
-  TVITEMA query{TVIF_TEXT, item};
+  TVITEMA query{};
+  query.mask = TVIF_TEXT;
+  query.hItem = item;
   query.pszText = text;
   query.cchTextMax = MAX_PATH;
   SendMessageA(tree, TVM_GETITEMA, 0, reinterpret_cast<LPARAM>(&query));
@@ -52,7 +55,8 @@ inline HTREEITEM ChildNamed(HWND tree, HTREEITEM parent, const std::string &text
 // Right-clicks the selected folder and chooses "&Folder settings"; the dialog, or null.
 inline HWND OpenFolderSettings(HWND tree) {
   RECT rect{};
-  *reinterpret_cast<HTREEITEM *>(&rect) = TreeNext(tree, nullptr, TVGN_CARET);
+  const HTREEITEM caret = TreeNext(tree, nullptr, TVGN_CARET);
+  std::memcpy(&rect, &caret, sizeof caret);  // TVM_GETITEMRECT takes the item in the rectangle
   SendMessageA(tree, TVM_GETITEMRECT, TRUE, reinterpret_cast<LPARAM>(&rect));
   POINT centre{(rect.left + rect.right) / 2, (rect.top + rect.bottom) / 2};
   const LPARAM at = MAKELPARAM(centre.x, centre.y);

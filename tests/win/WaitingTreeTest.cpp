@@ -74,19 +74,25 @@ class WaitingTree : public ::testing::Test {
   }
   void TearDown() override { ImageList_Destroy(m_images); }
   HTREEITEM Folder(const char *name) const {
-    TVINSERTSTRUCTA insert{TVI_ROOT, TVI_LAST, {}};
+    TVINSERTSTRUCTA insert{};
+    insert.hParent = TVI_ROOT;
+    insert.hInsertAfter = TVI_LAST;
     insert.item.mask = TVIF_TEXT | TVIF_CHILDREN;
     insert.item.pszText = const_cast<char *>(name);
     insert.item.cChildren = 1;
     return m_tree.InsertItem(insert);
   }
   int ChildrenButton(HTREEITEM item) const {
-    TVITEMA query{TVIF_CHILDREN, item};
+    TVITEMA query{};
+    query.mask = TVIF_CHILDREN;
+    query.hItem = item;
     m_tree.GetItem(&query);
     return query.cChildren;
   }
   void Notify(UINT code, HTREEITEM item) const {
-    NMTREEVIEWA notice{{m_tree.m_hWnd, 1, code}, TVE_EXPAND};
+    NMTREEVIEWA notice{};
+    notice.hdr = NMHDR{m_tree.m_hWnd, 1, code};
+    notice.action = TVE_EXPAND;
     notice.itemNew.hItem = item;
     SendMessageA(m_parent.m_hWnd, WM_NOTIFY, 1, reinterpret_cast<LPARAM>(&notice));
   }
