@@ -2,7 +2,6 @@
 
 #include "catalogue/DwgData.h"
 #include "catalogue/Ombra3Doc.h"
-#include "catalogue/ScanFilter.h"
 #include "explorer/LeftView.h"
 #include "explorer/MainFrame.h"
 #include "filecmd/ForFileCommands.h"
@@ -101,10 +100,7 @@ void exCDwgThumbnail::ControlClick() {
 void exCDwgThumbnail::Accept() const {
   if (g_pDoc) {
     g_pDoc->m_strName = Record().m_strDwgName;
-    // The browse returns the whole path in lower case, as the catalogue holds the names.
-    std::string folder = FolderWithSeparator(CurrentDirectory());
-    LowerAsciiInPlace(folder.data());
-    g_pDoc->m_strPath = folder;
+    g_pDoc->m_strPath = FolderWithSeparator(CurrentDirectory());
   }
   if (fw::CWinApp *app = fw::AfxGetApp(); app && app->m_pMainWnd) app->m_pMainWnd->PostMessage(WM_APP, 1, 0);
 }

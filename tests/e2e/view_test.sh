@@ -83,8 +83,8 @@ for _ in $(seq 50); do
 done
 kill -0 "$host" 2>/dev/null && { kill "$host"; echo "FAILED: the host did not end after the double click"; failed=$((failed + 1)); }
 wait "$host"
-lower=$(echo "$folder" | tr 'A-Z' 'a-z')
-check "the double click accepts" "(\"${lower//\\/\\\\}\\\\${names[0]}\" (\"\" \"\" \"\"))" "$(tr -d '\r' <"$work/out")"
+
+check "the double click accepts" "(\"${folder//\\/\\\\}\\\\${names[0]}\" (\"\" \"\" \"\"))" "$(tr -d '\r' <"$work/out")"
 
 echo "e2e view: $passed passed, $failed failed"
 [ "$failed" -eq 0 ]

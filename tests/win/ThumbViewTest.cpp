@@ -293,7 +293,6 @@ TEST_F(ThumbView, DoubleClickAcceptsTheDrawingAsANestedList) {
     shape.emplace_back(node->restype, node->restype == RTSTR ? node->resval.rstring : L"");
   acutRelRb(result);
   devhostClearResult();
-  CharLowerA(path.data());
   const std::wstring file(path.begin(), path.end());
   const std::vector<std::pair<int, std::wstring>> expected{
       {RTSTR, file + L"d001.dwg"}, {RTLB, L""}, {RTSTR, L""}, {RTSTR, L""}, {RTSTR, L""}, {RTLE, L""}};
