@@ -90,15 +90,15 @@ keys "$frame" Down
 X=0 Y=0 HEIGHT=300
 eval "$(xdotool getwindowgeometry --shell "$frame" 2>/dev/null)"
 xdotool key Right 2>/dev/null
+bar() {  # bar SHOT: 1 when the tree pane shows red, the bar's fill (the Close cross lies outside)
+  import -window root "$1"
+  convert "$1" -crop "260x$((HEIGHT - 160))+$X+$((Y + 60))" +repage -fill black +opaque '#FF0000' \
+    -format '%[fx:maxima.r>0?1:0]' info:
+}
 red=0
-for i in 1 2 3; do
-  import -window root "$shots/tree-loading-$i.png"
-  # Red in the tree pane: the bar's fill (the Close button's cross lies outside it).
-  convert "$shots/tree-loading-$i.png" -crop "260x$((HEIGHT - 160))+$X+$((Y + 60))" +repage -fill black \
-    +opaque '#FF0000' -format '%[fx:maxima.r>0?1:0]' info: | grep -q 1 && red=1
-done
+for i in 1 2 3; do [ "$(bar "$shots/tree-loading-$i.png")" == 1 ] && red=1; done
 check "the progress bar shows while 20,000 folders load" 1 "$red"
-sleep 1
+for _ in $(seq 60); do [ "$(bar "$work/loaded.png")" == 0 ] && break; sleep 0.5; done
 keys "$frame" Left Down
 check "the keys choose the next folder once the load is done" "$plans\\Details" "$(named "$frame" "$plans\\Details")"
 keys "$frame" Tab
