@@ -2,5 +2,6 @@
 target_sources(WaitingTreeTest PRIVATE
   ${CMAKE_SOURCE_DIR}/src/explorer/WaitingTreeCtrl.cpp
   ${CMAKE_SOURCE_DIR}/src/fw/Controls.cpp
-  ${CMAKE_SOURCE_DIR}/src/fw/Wnd.cpp)
+  ${CMAKE_SOURCE_DIR}/src/fw/Wnd.cpp
+  ${CMAKE_SOURCE_DIR}/src/fw/WinApp.cpp)
 target_link_libraries(WaitingTreeTest PRIVATE comctl32 winmm)
