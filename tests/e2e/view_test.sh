@@ -43,7 +43,7 @@ for _ in $(seq 100); do
   [ -n "$frame" ] && break
   sleep 0.2
 done
-check "the explorer shows the folder" "$folder\\" "$(xdotool getwindowname "$frame" 2>/dev/null)"
+check "the explorer shows the folder" "$folder" "$(xdotool getwindowname "$frame" 2>/dev/null)"
 sleep 1
 eval "$(xdotool getwindowgeometry --shell "$frame")"
 # The view starts below the tool bar, right of the folder pane; 4 columns 178 pixels apart, rows 163.

@@ -243,7 +243,7 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
                                 {WM_LBUTTONDOWN, 2, MK_LBUTTON | MK_SHIFT, {0}, false, nullptr, {}, 0},
                                 {WM_LBUTTONDOWN, 2, MK_LBUTTON, {2}, true, "\\d002.dwg", {}, 0},
                                 {WM_RBUTTONDOWN, 3, MK_RBUTTON, {2, 3}, true, "\\d003.dwg", {VK_DOWN, VK_RETURN}, 0},
-                                {WM_RBUTTONDOWN, 4, MK_RBUTTON, {}, true, "\\", {'D'}, IDNO}};  // refused, rescanned
+                                {WM_RBUTTONDOWN, 4, MK_RBUTTON, {}, true, "", {'D'}, IDNO}};  // refused, rescanned
   MakeDrawings(6);
   const ScratchFolder elsewhere("thumbview-other");
   const std::string other = elsewhere.File("new.dwg", "");
