@@ -43,32 +43,19 @@ std::string WideBytes(const std::u16string &text) {
 
 using Paths = std::vector<std::string>;
 
-TEST(FileListBlock, CopyOfTwoDrawingsIsHeaderThenPathsThenFinalNul) {
-  const std::string block = EncodeFileList({"C:\\Work\\a.dwg", "C:\\Work\\c.dwg"});
-  EXPECT_EQ(block, Header(20, 0) + std::string("C:\\Work\\a.dwg\0C:\\Work\\c.dwg\0\0", 29));
-}
-
-TEST(FileListBlock, NothingMarkedGivesAnEmptyList) {
-  const std::string block = EncodeFileList({});
-  EXPECT_EQ(block, Header(20, 0) + std::string(1, '\0'));
-  EXPECT_TRUE(NarrowPaths(block).empty());
-}
-
-TEST(FileListBlock, NarrowListReadsBackAsWritten) {
+TEST(FileListBlock, CopyIsHeaderThenNarrowPathsThenFinalNulAndReadsBackAsWritten) {
+  EXPECT_EQ(EncodeFileList({"C:\\Work\\a.dwg", "C:\\Work\\c.dwg"}),
+            Header(20, 0) + std::string("C:\\Work\\a.dwg\0C:\\Work\\c.dwg\0\0", 29));
+  EXPECT_EQ(EncodeFileList({}), Header(20, 0) + std::string(1, '\0'));
+  EXPECT_TRUE(NarrowPaths(EncodeFileList({})).empty());
   const Paths written{"C:\\a.dwg", "Z:\\tmp\\notes.txt", "\\\\server\\share\\x.DWG"};
   const std::string block = EncodeFileList(written);
   EXPECT_FALSE(FileListReader(block.data(), block.size()).IsWide());
   EXPECT_EQ(NarrowPaths(block), written);
 }
 
-TEST(FileListBlock, ListStopsAtTheFirstEmptyPath) {
-  const std::string block = Header(20, 0) + std::string("a\0\0b\0\0", 6);
-  EXPECT_EQ(NarrowPaths(block), Paths{"a"});
-}
-
-TEST(FileListBlock, ListIsReadFromTheOffsetTheHeaderGives) {
-  const std::string block = Header(24, 0) + "junk" + std::string("C:\\x.dwg\0\0", 10);
-  EXPECT_EQ(NarrowPaths(block), Paths{"C:\\x.dwg"});
+TEST(FileListBlock, ListIsReadFromTheOffsetTheHeaderGivesToTheFirstEmptyPath) {
+  EXPECT_EQ(NarrowPaths(Header(24, 0) + "junk" + std::string("C:\\x.dwg\0\0b\0\0", 13)), Paths{"C:\\x.dwg"});
 }
 
 TEST(FileListBlock, BlockIsNeverReadPastItsEnd) {
@@ -102,6 +89,8 @@ TEST(FileListBlock, WideListIsReadWithinTheBlock) {
   const std::string block = Header(21, 1) + "#" + WideBytes(u"C:\\a") + std::string(2, '\0') + WideBytes(u"C:\\b") + "x";
   EXPECT_EQ(WidePaths(block), (std::vector<std::u16string>{u"C:\\a", u"C:\\b"}));
   EXPECT_TRUE(WidePaths(Header(20, 1)).empty());
+  EXPECT_TRUE(WidePaths(Header(0xFFFFFFF0u, 1) + WideBytes(u"C:\\a")).empty()) << "an offset past the end";
+  EXPECT_TRUE(WidePaths(Header(16, 1) + WideBytes(u"C:\\a")).empty()) << "an offset into the header";
   EXPECT_TRUE(WidePaths(Header(20, 1) + "x").empty());
 }
 }  // namespace

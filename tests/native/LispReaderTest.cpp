@@ -28,49 +28,27 @@ Value Sym(const wchar_t *name) { return Value::Sym(name); }
 
 }  // namespace
 
-TEST(LispReader, IntegersAreThirtyTwoBitAndBiggerLiteralsBecomeReals) {
-  EXPECT_EQ(ReadOne(L"42"), Value::Int(42));
-  EXPECT_EQ(ReadOne(L"-7"), Value::Int(-7));
-  EXPECT_EQ(ReadOne(L"+5"), Value::Int(5));
-  EXPECT_EQ(ReadOne(L"007"), Value::Int(7));
-  EXPECT_EQ(ReadOne(L"2147483647"), Value::Int(2147483647));
-  EXPECT_EQ(ReadOne(L"-2147483648"), Value::Int(INT32_MIN));
-  EXPECT_EQ(ReadOne(L"2147483648"), Value::Real(2147483648.0));
-  EXPECT_EQ(ReadOne(L"-2147483649"), Value::Real(-2147483649.0));
-  EXPECT_EQ(ReadOne(L"99999999999999999999"), Value::Real(1e20));
-}
-
-TEST(LispReader, RealsInEveryWrittenForm) {
-  EXPECT_EQ(ReadOne(L"1.5"), Value::Real(1.5));
-  EXPECT_EQ(ReadOne(L"-2."), Value::Real(-2.0));
-  EXPECT_EQ(ReadOne(L".5"), Value::Real(0.5));
-  EXPECT_EQ(ReadOne(L"-.25"), Value::Real(-0.25));
-  EXPECT_EQ(ReadOne(L"1e3"), Value::Real(1000.0));
-  EXPECT_EQ(ReadOne(L"1.5e-2"), Value::Real(0.015));
-  EXPECT_EQ(ReadOne(L"2E+2"), Value::Real(200.0));
-  EXPECT_EQ(ReadOne(L"1e999"), Value::Real(INFINITY));
-  EXPECT_EQ(ReadOne(L"-1e999"), Value::Real(-INFINITY));
-  EXPECT_EQ(ReadOne(L"1e-999"), Value::Real(0.0));
-  EXPECT_EQ(ReadOne(L"0.0000001e400"), Value::Real(INFINITY));
-}
-
-TEST(LispReader, TokensThatAreNotWhollyNumbersAreSymbols) {
-  EXPECT_EQ(ReadOne(L"1+"), Sym(L"1+"));
-  EXPECT_EQ(ReadOne(L"-"), Sym(L"-"));
-  EXPECT_EQ(ReadOne(L"1e"), Sym(L"1E"));
-  EXPECT_EQ(ReadOne(L"1.2.3"), Sym(L"1.2.3"));
-  EXPECT_EQ(ReadOne(L"c:MyCmd"), Sym(L"C:MYCMD"));
-  EXPECT_EQ(ReadOne(L"a.b"), Sym(L"A.B"));
-  EXPECT_EQ(ReadOne(L"\u00e9t\u00e9"), Sym(L"\u00c9T\u00c9"));
-}
-
-TEST(LispReader, NilAndTInAnyCase) {
-  EXPECT_EQ(ReadOne(L"nil"), Value::Nil());
-  EXPECT_EQ(ReadOne(L"NiL"), Value::Nil());
-  EXPECT_EQ(ReadOne(L"()"), Value::Nil());
-  EXPECT_EQ(ReadOne(L"t"), Value::True());
-  EXPECT_EQ(ReadOne(L"T"), Value::True());
-  EXPECT_EQ(ReadOne(L"tt"), Sym(L"TT"));
+TEST(LispReader, NumbersSymbolsNilAndT) {
+  const std::pair<const wchar_t *, Value> rows[] = {
+      {L"+5", Value::Int(5)},
+      {L"007", Value::Int(7)},
+      {L"2147483647", Value::Int(INT32_MAX)},
+      {L"-2147483648", Value::Int(INT32_MIN)},
+      {L"2147483648", Value::Real(2147483648.0)},  // past 32 bits an integer literal is a real
+      {L"99999999999999999999", Value::Real(1e20)},
+      {L"-.25", Value::Real(-0.25)},
+      {L"1.5e-2", Value::Real(0.015)},
+      {L"2E+2", Value::Real(200.0)},
+      {L"1e999", Value::Real(INFINITY)},
+      {L"1e-999", Value::Real(0.0)},
+      {L"0.0000001e400", Value::Real(INFINITY)},
+      {L"1+", Sym(L"1+")},
+      {L"c:MyCmd", Sym(L"C:MYCMD")},
+      {L"\u00e9t\u00e9", Sym(L"\u00c9T\u00c9")},
+      {L"NiL", Value::Nil()},
+      {L"t", Value::True()},
+      {L"tt", Sym(L"TT")}};
+  for (const auto &[source, value] : rows) EXPECT_EQ(ReadOne(source), value) << source;
 }
 
 TEST(LispReader, StringEscapes) {
@@ -99,26 +77,20 @@ TEST(LispReader, ListsQuotesAndComments) {
   EXPECT_TRUE(lisp::ReadAll(L";| never closed").empty());
 }
 
-TEST(LispReader, DottedTailsThatAreListsJoinTheList) {
+TEST(LispReader, DottedTailsThatAreListsJoinTheListOtherwiseMessages) {
   EXPECT_EQ(ReadOne(L"(a . (b c))"), Value::List({Sym(L"A"), Sym(L"B"), Sym(L"C")}));
   EXPECT_EQ(ReadOne(L"(a . nil)"), Value::List({Sym(L"A")}));
-  EXPECT_EQ(ReadError(L"(a . b)"), "dotted pairs are not supported on input");
-  EXPECT_EQ(ReadError(L"(. a)"), "misplaced dot on input");
-  EXPECT_EQ(ReadError(L"(a . b c)"), "misplaced dot on input");
-  EXPECT_EQ(ReadError(L"(a .)"), "misplaced dot on input");
-  EXPECT_EQ(ReadError(L"."), "misplaced dot on input");
-}
-
-TEST(LispReader, MalformedInputMessages) {
-  EXPECT_EQ(ReadError(L"(1 2"), "malformed list on input");
-  EXPECT_EQ(ReadError(L"((1) (2)"), "malformed list on input");
-  EXPECT_EQ(ReadError(L"(princ \"abc)"), "malformed list on input");
-  EXPECT_EQ(ReadError(L"\"abc"), "malformed string on input");
-  EXPECT_EQ(ReadError(L"\"abc\\"), "malformed string on input");
-  EXPECT_EQ(ReadError(L"'"), "malformed list on input");
-  EXPECT_EQ(ReadError(L"(a ')"), "malformed list on input");
-  EXPECT_EQ(ReadError(L")"), "extra right paren on input");
-  EXPECT_EQ(ReadError(L"(a))"), "extra right paren on input");
+  const char *const dot = "misplaced dot on input", *const list = "malformed list on input";
+  const std::pair<const wchar_t *, const char *> rows[] = {{L"(a . b)", "dotted pairs are not supported on input"},
+                                                           {L"(. a)", dot},
+                                                           {L".", dot},
+                                                           {L"(1 2", list},
+                                                           {L"(princ \"abc)", list},
+                                                           {L"(a ')", list},
+                                                           {L"\"abc", "malformed string on input"},
+                                                           {L"\"abc\\", "malformed string on input"},
+                                                           {L")", "extra right paren on input"}};
+  for (const auto &[source, message] : rows) EXPECT_EQ(ReadError(source), message) << source;
 }
 
 TEST(LispReader, NestingIsLimitedWithoutExhaustingTheStack) {

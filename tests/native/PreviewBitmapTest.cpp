@@ -97,56 +97,37 @@ TEST(PreviewBitmap, TrueColourRowsPaddingAndOrientation) {
   EXPECT_EQ(decode(buildDib(v5, {0x11, 0x22, 0x33, 0})).pixels[0], 0xFF112233u);
 }
 
-TEST(PreviewBitmapHostile, ImpossibleHeadersAreRefused) {
+TEST(PreviewBitmapHostile, ImpossibleHeadersAndClaimsBeyondTheEntryAreRefused) {
   const Bytes pixel = {1, 2, 3, 0};
   EXPECT_TRUE(refuses({}));
   EXPECT_TRUE(refuses(Bytes(39, 0)));
   for (int32_t width : {0, -1, 4097, INT32_MIN}) EXPECT_TRUE(refuses(buildDib(spec(width, 1, 24), pixel))) << "width " << width;
-  for (int32_t height : {0, 4097, -4097, INT32_MIN})
-    EXPECT_TRUE(refuses(buildDib(spec(1, height, 24), pixel))) << "height " << height;
+  for (int32_t height : {0, 4097, -4097, INT32_MIN}) EXPECT_TRUE(refuses(buildDib(spec(1, height, 24), pixel))) << height;
   for (uint16_t bits : {0, 2, 7, 48}) EXPECT_TRUE(refuses(buildDib(spec(1, 1, bits), Bytes(64, 0)))) << bits << " bits";
-  for (uint32_t headerSize : {12u, 41u, 200u, 0xFFFFFFFFu}) {
-    DibSpec s = spec(1, 1, 24);
-    s.headerSize = headerSize;
-    EXPECT_TRUE(refuses(buildDib(s, pixel))) << "header size " << headerSize;
-  }
-  DibSpec planes = spec(1, 1, 24);
-  planes.planes = 0;
-  EXPECT_TRUE(refuses(buildDib(planes, pixel)));
-
-  // Run-length compression is not written in previews, and masks make no sense at 24 bits.
-  DibSpec rle = spec(1, 1, 8);
-  rle.compression = 1;
-  rle.palette = {0};
-  EXPECT_TRUE(refuses(buildDib(rle, pixel)));
-  DibSpec fields24 = spec(1, 1, 24);
-  fields24.compression = 3;
-  fields24.masks = {0xFF0000, 0xFF00, 0xFF};
-  EXPECT_TRUE(refuses(buildDib(fields24, pixel)));
+  const auto with = [](int32_t width, int32_t height, uint16_t bits, const std::function<void(DibSpec &)> &change) {
+    DibSpec s = spec(width, height, bits);
+    change(s);
+    return s;
+  };
+  const std::pair<const char *, DibSpec> hostile[] = {
+      {"header size 12", with(1, 1, 24, [](DibSpec &s) { s.headerSize = 12; })},
+      {"header size past the entry", with(1, 1, 24, [](DibSpec &s) { s.headerSize = 0xFFFFFFFF; })},
+      {"no planes", with(1, 1, 24, [](DibSpec &s) { s.planes = 0; })},
+      {"run-length compression", with(1, 1, 8, [](DibSpec &s) { s.compression = 1, s.palette = {0}; })},
+      {"masks at 24 bits", with(1, 1, 24,
+                                [](DibSpec &s) {
+                                  s.compression = 3, s.masks = {0xFF0000, 0xFF00, 0xFF};
+                                })},
+      {"palette larger than the entry", with(1, 1, 8, [](DibSpec &s) { s.colorsUsed = 256, s.palette.resize(10); })},
+      {"more colours than 4 bits index", with(1, 1, 4, [](DibSpec &s) { s.colorsUsed = 17, s.palette.resize(17); })},
+      {"colours times four wrap", with(1, 1, 24, [](DibSpec &s) { s.colorsUsed = 0x40000000; })},
+  };
+  for (const auto &[what, dib] : hostile) EXPECT_TRUE(refuses(buildDib(dib, pixel))) << what;
   DibSpec cutMasks = spec(1, 1, 16);
   cutMasks.compression = 3;
-  Bytes masksCut = buildDib(cutMasks, {});
-  EXPECT_TRUE(refuses(masksCut)) << "masks missing";
-}
-
-TEST(PreviewBitmapHostile, PaletteOrPixelsBeyondTheEntryAreRefused) {
-  DibSpec bigPalette = spec(1, 1, 8);
-  bigPalette.colorsUsed = 256;
-  bigPalette.palette = std::vector<uint32_t>(10, 0);
-  EXPECT_TRUE(refuses(buildDib(bigPalette, {0, 0, 0, 0}))) << "palette larger than the entry";
-
-  DibSpec tooManyColours = spec(1, 1, 4);
-  tooManyColours.colorsUsed = 17;
-  tooManyColours.palette = std::vector<uint32_t>(17, 0);
-  EXPECT_TRUE(refuses(buildDib(tooManyColours, {0, 0, 0, 0}))) << "more colours than 4 bits index";
-
-  DibSpec hugeColours = spec(1, 1, 24);
-  hugeColours.colorsUsed = 0x40000000;  // colours times four wraps a 32-bit size
-  EXPECT_TRUE(refuses(buildDib(hugeColours, {0, 0, 0, 0})));
-
+  EXPECT_TRUE(refuses(buildDib(cutMasks, {}))) << "masks missing";
   // The largest allowed picture with its rows missing: refused before anything is allocated.
   EXPECT_TRUE(refuses(buildDib(spec(4096, 4096, 32), Bytes(4096, 0))));
-
   Bytes shortRow = buildDib(spec(3, 2, 24), Bytes(24, 0));
   shortRow.pop_back();
   EXPECT_TRUE(refuses(shortRow)) << "last row one byte short";

@@ -5,37 +5,29 @@
 
 #include <gtest/gtest.h>
 
+#include <tuple>
+
 using namespace devhost::preview;
 using previewtest::Bytes;
 
-namespace {
-
-void expectFit(const FitRect &fit, int32_t left, int32_t top, int32_t width, int32_t height, const char *what = "") {
-  SCOPED_TRACE(what);
-  EXPECT_EQ(fit.left, left);
-  EXPECT_EQ(fit.top, top);
-  EXPECT_EQ(fit.width, width);
-  EXPECT_EQ(fit.height, height);
-}
-
-}  // namespace
-
 TEST(PreviewFit, ScalesToFitKeepingAspectAndCentres) {
-  expectFit(fitCentred(256, 160, 256, 160), 0, 0, 256, 160);
-  expectFit(fitCentred(256, 102, 200, 200), 0, 60, 200, 80, "wide picture: bands above and below");
-  expectFit(fitCentred(120, 200, 200, 200), 40, 0, 120, 200, "tall picture: bands left and right");
-  expectFit(fitCentred(16, 10, 160, 160), 0, 30, 160, 100, "small pictures grow");
-  expectFit(fitCentred(3, 1, 10, 10), 0, 3, 10, 3, "odd remainder stays centred");
-  expectFit(fitCentred(4096, 1, 100, 100), 0, 49, 100, 1, "a line stays visible");
-  expectFit(fitCentred(4096, 4096, 0x7FFFFFFF, 1), 0x3FFFFFFF, 0, 1, 1);
-}
-
-TEST(PreviewFit, EmptyPictureOrAreaGivesNothing) {
-  for (const FitRect &fit :
-       {fitCentred(0, 10, 100, 100), fitCentred(10, 0, 100, 100), fitCentred(10, 10, 0, 100), fitCentred(10, 10, 100, -5)}) {
-    EXPECT_EQ(fit.width, 0);
-    EXPECT_EQ(fit.height, 0);
+  const struct {
+    int32_t pictureWidth, pictureHeight, areaWidth, areaHeight, left, top, width, height;
+  } rows[] = {{256, 160, 256, 160, 0, 0, 256, 160},
+              {256, 102, 200, 200, 0, 60, 200, 80},   // wide picture: bands above and below
+              {120, 200, 200, 200, 40, 0, 120, 200},  // tall picture: bands left and right
+              {16, 10, 160, 160, 0, 30, 160, 100},    // small pictures grow
+              {3, 1, 10, 10, 0, 3, 10, 3},            // an odd remainder stays centred
+              {4096, 1, 100, 100, 0, 49, 100, 1},     // a line stays visible
+              {4096, 4096, 0x7FFFFFFF, 1, 0x3FFFFFFF, 0, 1, 1}};
+  for (const auto &r : rows) {
+    const FitRect fit = fitCentred(r.pictureWidth, r.pictureHeight, r.areaWidth, r.areaHeight);
+    EXPECT_EQ(std::make_tuple(fit.left, fit.top, fit.width, fit.height), std::make_tuple(r.left, r.top, r.width, r.height))
+        << r.pictureWidth << "x" << r.pictureHeight << " in " << r.areaWidth << "x" << r.areaHeight;
   }
+  for (const FitRect &fit :
+       {fitCentred(0, 10, 100, 100), fitCentred(10, 0, 100, 100), fitCentred(10, 10, 0, 100), fitCentred(10, 10, 100, -5)})
+    EXPECT_EQ(std::make_pair(fit.width, fit.height), std::make_pair(0, 0)) << "an empty picture or area gives nothing";
 }
 
 namespace {

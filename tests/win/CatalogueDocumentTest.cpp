@@ -1,5 +1,6 @@
 // The document's explorer state: read beside the module when it is made, written when it goes.
 #include "catalogue/Ombra3Doc.h"
+#include "ScratchFolder.h"
 #include "catalogue/StateFilePath.h"
 
 #include <gtest/gtest.h>
@@ -19,14 +20,7 @@ std::string StateFile() {
   return ComposeStateFilePath(program);
 }
 
-std::string ReadFile(const std::string &path) {
-  std::ifstream file(path, std::ios::binary);
-  std::ostringstream content;
-  content << file.rdbuf();
-  return content.str();
-}
-
-void WriteFile(const std::string &path, const std::string &content) { std::ofstream(path, std::ios::binary) << content; }
+void WriteState(const std::string &content) { std::ofstream(StateFile(), std::ios::binary) << content; }
 
 bool Exists(const std::string &path) { return GetFileAttributesA(path.c_str()) != INVALID_FILE_ATTRIBUTES; }
 
@@ -41,91 +35,57 @@ class ExplorerState : public ::testing::Test {
   }
 };
 
-const char kDefaultFile[] =
-    "[CurrentPath]\r\nPath=\r\nName=\r\nShellPath=\r\n\r\n"
-    "[Size]\r\nSplitterSize=100\r\nWindowWidth=0\r\nWindowHeight=0\r\n\r\n"
-    "[View]\r\nPictureWidth=0\r\nPictureHeight=0\r\nSort=0\r\n\r\n";
+// Every value the document keeps, in the order of the file.
+std::string Values(const COmbra3Doc &d) {
+  std::ostringstream out;
+  out << d.m_strPath << "|" << d.m_strName << "|" << d.m_strShellPath << "|" << d.m_nSplitterSize << "|" << d.m_nWindowWidth
+      << "|" << d.m_nWindowHeight << "|" << d.m_nPictureWidth << "|" << d.m_nPictureHeight << "|" << d.m_nSort;
+  return out.str();
+}
 
-TEST_F(ExplorerState, WithoutAFileTheDefaultsAreUsedAndEveryKeyIsWritten) {
+TEST_F(ExplorerState, WithoutAFileTheDefaultsAreUsedAndEveryKeyIsWrittenAtTheEnd) {
   auto document = std::make_unique<COmbra3Doc>();
   EXPECT_EQ(g_pDoc, document.get());
   EXPECT_EQ(document->m_iniFile.m_path, StateFile());
-  EXPECT_EQ(document->m_strPath, "");
-  EXPECT_EQ(document->m_strName, "");
-  EXPECT_EQ(document->m_strShellPath, "");
-  EXPECT_EQ(document->m_nSplitterSize, 100);
-  EXPECT_EQ(document->m_nWindowWidth, 0);
-  EXPECT_EQ(document->m_nWindowHeight, 0);
-  EXPECT_EQ(document->m_nPictureWidth, 0);
-  EXPECT_EQ(document->m_nPictureHeight, 0);
-  EXPECT_EQ(document->m_nSort, 0);
+  EXPECT_EQ(Values(*document), "|||100|0|0|0|0|0");
   EXPECT_FALSE(Exists(StateFile()));  // read only; written when the call ends
-
   document.reset();
   EXPECT_EQ(g_pDoc, nullptr);
-  EXPECT_EQ(ReadFile(StateFile()), kDefaultFile);
-}
+  EXPECT_EQ(Content(StateFile()),
+            "[CurrentPath]\r\nPath=\r\nName=\r\nShellPath=\r\n\r\n"
+            "[Size]\r\nSplitterSize=100\r\nWindowWidth=0\r\nWindowHeight=0\r\n\r\n"
+            "[View]\r\nPictureWidth=0\r\nPictureHeight=0\r\nSort=0\r\n\r\n");
 
-TEST_F(ExplorerState, ValuesTravelToTheNextCall) {
   {
-    COmbra3Doc document;
-    document.m_strPath = "C:\\Work\\";
-    document.m_strName = "plan.dwg";
-    document.m_strShellPath = "Desktop\\My Computer\\ (C:)\\Work";
-    document.m_nSplitterSize = 250;
-    document.m_nWindowWidth = 800;
-    document.m_nWindowHeight = 600;
-    document.m_nPictureWidth = 200;
-    document.m_nPictureHeight = 150;
-    document.m_nSort = 2;
+    COmbra3Doc changed;
+    changed.m_strPath = "C:\\Work\\";
+    changed.m_strName = "plan.dwg";
+    changed.m_strShellPath = "Desktop\\My Computer\\ (C:)\\Work";
+    changed.m_nSplitterSize = 250;
+    changed.m_nWindowWidth = 800;
+    changed.m_nWindowHeight = 600;
+    changed.m_nPictureWidth = 200;
+    changed.m_nPictureHeight = 150;
+    changed.m_nSort = 2;
   }
-  COmbra3Doc next;
-  EXPECT_EQ(next.m_strPath, "C:\\Work\\");
-  EXPECT_EQ(next.m_strName, "plan.dwg");
-  EXPECT_EQ(next.m_strShellPath, "Desktop\\My Computer\\ (C:)\\Work");
-  EXPECT_EQ(next.m_nSplitterSize, 250);
-  EXPECT_EQ(next.m_nWindowWidth, 800);
-  EXPECT_EQ(next.m_nWindowHeight, 600);
-  EXPECT_EQ(next.m_nPictureWidth, 200);
-  EXPECT_EQ(next.m_nPictureHeight, 150);
-  EXPECT_EQ(next.m_nSort, 2);
+  EXPECT_EQ(Values(COmbra3Doc()), "C:\\Work\\|plan.dwg|Desktop\\My Computer\\ (C:)\\Work|250|800|600|200|150|2")
+      << "values travel to the next call";
 }
 
-TEST_F(ExplorerState, NumbersAreReadAsPlainDecimalsAndKeptWithoutCorrection) {
-  WriteFile(StateFile(),
-            "[Size]\r\nSplitterSize=wide\r\nWindowWidth=640px\r\nWindowHeight=-3\r\n"
-            "[View]\r\nPictureWidth=0\r\nPictureHeight=200\r\nSort=7\r\n");
+TEST_F(ExplorerState, AnExistingFileKeepsItsOrderItsOtherEntriesAndItsNumbersUncorrected) {
+  WriteState(
+      "[View]\r\nSort=7\r\nTheme=dark\r\nPictureHeight=200\r\n\r\n[Notes]\r\nowner=me\r\n\r\n"
+      "[CurrentPath]\r\nName=door.dwg\r\nPath=Z:\\blocks\r\n\r\n"
+      "[Size]\r\nSplitterSize=wide\r\nWindowWidth=640px\r\nWindowHeight=-3\r\n");
   {
     COmbra3Doc document;
-    EXPECT_EQ(document.m_nSplitterSize, 100);
-    EXPECT_EQ(document.m_nWindowWidth, 640);
-    EXPECT_EQ(document.m_nWindowHeight, -3);
-    EXPECT_EQ(document.m_nPictureWidth, 0);
-    EXPECT_EQ(document.m_nPictureHeight, 200);
-    EXPECT_EQ(document.m_nSort, 7);
-  }
-  const std::string saved = ReadFile(StateFile());
-  EXPECT_NE(saved.find("SplitterSize=100\r\nWindowWidth=640\r\nWindowHeight=-3\r\n"), std::string::npos) << saved;
-  EXPECT_NE(saved.find("PictureWidth=0\r\nPictureHeight=200\r\nSort=7\r\n"), std::string::npos) << saved;
-}
-
-TEST_F(ExplorerState, AnExistingFileKeepsItsOrderAndItsOtherEntries) {
-  WriteFile(StateFile(),
-            "[View]\r\nSort=1\r\nTheme=dark\r\n\r\n"
-            "[Notes]\r\nowner=me\r\n\r\n"
-            "[CurrentPath]\r\nName=door.dwg\r\nPath=Z:\\blocks\r\n");
-  {
-    COmbra3Doc document;
-    EXPECT_EQ(document.m_nSort, 1);
-    EXPECT_EQ(document.m_strName, "door.dwg");
-    EXPECT_EQ(document.m_strPath, "Z:\\blocks");
+    EXPECT_EQ(Values(document), "Z:\\blocks|door.dwg||100|640|-3|0|200|7") << "numbers are read as plain decimals";
     document.m_strName = "window.dwg";
   }
-  EXPECT_EQ(ReadFile(StateFile()),
-            "[View]\r\nSort=1\r\nTheme=dark\r\nPictureWidth=0\r\nPictureHeight=0\r\n\r\n"
-            "[Notes]\r\nowner=me\r\n\r\n"
+  EXPECT_EQ(Content(StateFile()),
+            "[View]\r\nSort=7\r\nTheme=dark\r\nPictureHeight=200\r\nPictureWidth=0\r\n\r\n[Notes]\r\nowner=me\r\n\r\n"
             "[CurrentPath]\r\nName=window.dwg\r\nPath=Z:\\blocks\r\nShellPath=\r\n\r\n"
-            "[Size]\r\nSplitterSize=100\r\nWindowWidth=0\r\nWindowHeight=0\r\n\r\n");
+            "[Size]\r\nSplitterSize=100\r\nWindowWidth=640\r\nWindowHeight=-3\r\n\r\n");
 }
 
 TEST_F(ExplorerState, AStateFileThatCannotBeReadOrReplacedLosesOnlyThisCall) {

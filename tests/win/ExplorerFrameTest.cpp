@@ -14,6 +14,11 @@ constexpr int kCancel = 32796;
 constexpr int kSortByName = 32799;
 constexpr int kSortByDate = 32788;
 constexpr int kSortBySize = 32789;
+constexpr int kAppExit = 0xE141;
+constexpr int kViewToolbar = 0xE800;
+constexpr int kViewStatusBar = 0xE801;
+constexpr int kEditCopy = 0xE122;
+constexpr int kEditPaste = 0xE125;
 
 std::string StateFile(int sort, int width, int height, const std::string &path = "", const std::string &name = "") {
   std::ostringstream ini;
@@ -108,43 +113,41 @@ TEST_F(ExplorerFrame, DefaultCaptionsAreOkAndCancel) {
   EXPECT_EQ(captions, (std::vector<std::string>{"Ok", "Cancel"}));
 }
 
-TEST_F(ExplorerFrame, SortMenuChecksTheRememberedKeyOnly) {
-  for (int remembered : {0, 1, 2, 7}) {
-    m_state.Write(StateFile(remembered, 0, 0));
+TEST_F(ExplorerFrame, SortMenuChecksTheKeyAndTheSortCommandsSetIt) {
+  const struct {
+    int remembered, command;
+    std::vector<bool> checked;
+    const char *saved;
+  } rows[] = {{0, 0, {true, false, false}, "0"},           {1, 0, {false, true, false}, "1"},
+              {2, 0, {false, false, true}, "2"},           {7, 0, {false, false, false}, "7"},  // kept as it was
+              {7, kSortBySize, {false, false, true}, "2"}, {2, kSortByName, {true, false, false}, "0"}};
+  for (const auto &row : rows) {
+    m_state.Write(StateFile(row.remembered, 0, 0));
     std::vector<bool> checked;
     Browse(BrowseArgs(L""), [&](HWND frame) {
+      if (row.command) SendMessageA(frame, WM_COMMAND, row.command, 0);
       HMENU sort = GetSubMenu(GetMenu(frame), 2);
       SendMessageA(frame, WM_INITMENUPOPUP, reinterpret_cast<WPARAM>(sort), 2);
       for (int id : {kSortByName, kSortByDate, kSortBySize}) checked.push_back(GetMenuState(sort, id, MF_BYCOMMAND) & MF_CHECKED);
       Command(frame, kCancel);
     });
-    std::vector<bool> expected{remembered == 0, remembered == 1, remembered == 2};
-    EXPECT_EQ(checked, expected) << "remembered key " << remembered;
-    EXPECT_EQ(IniValue(m_state.Read(), "Sort"), std::to_string(remembered)) << "the key is kept as it was";
+    EXPECT_EQ(checked, row.checked) << "remembered " << row.remembered << ", command " << row.command;
+    EXPECT_EQ(IniValue(m_state.Read(), "Sort"), row.saved);
   }
 }
 
-TEST_F(ExplorerFrame, SortCommandsSetTheKeyAndMoveTheCheckMark) {
-  m_state.Write(StateFile(7, 0, 0));
-  std::vector<bool> checked;
-  Browse(BrowseArgs(L""), [&](HWND frame) {
-    SendMessageA(frame, WM_COMMAND, kSortBySize, 0);
-    HMENU sort = GetSubMenu(GetMenu(frame), 2);
-    SendMessageA(frame, WM_INITMENUPOPUP, reinterpret_cast<WPARAM>(sort), 2);
-    for (int id : {kSortByName, kSortByDate, kSortBySize}) checked.push_back(GetMenuState(sort, id, MF_BYCOMMAND) & MF_CHECKED);
-    Command(frame, kCancel);
-  });
-  EXPECT_EQ(checked, (std::vector<bool>{false, false, true}));
-  EXPECT_EQ(IniValue(m_state.Read(), "Sort"), "2");
-}
-
-TEST_F(ExplorerFrame, AcceptThenCloseEndsWithAccept) {
-  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
-    Command(frame, kAccept);
-    PostMessageA(frame, WM_CLOSE, 0, 0);
-  });
-  EXPECT_EQ(outcome.resultKind, RTLB) << "the first end message decides";
-  EXPECT_EQ(outcome.texts.size(), 4u);
+TEST_F(ExplorerFrame, TheFirstEndMessageDecidesAcceptOrCancel) {
+  const std::pair<std::function<void(HWND)>, int> rows[] = {
+      {[](HWND frame) { Command(frame, kAccept), PostMessageA(frame, WM_CLOSE, 0, 0); }, RTLB},
+      {[](HWND frame) { Command(frame, kCancel), Command(frame, kAccept); }, RTNIL},
+      {[](HWND frame) { Command(frame, kAppExit); }, RTNIL},
+      {[](HWND frame) {  // Escape in the folder tree
+         PostMessageA(GetWindow(GetDlgItem(GetDlgItem(frame, 0xE900), 0xE900), GW_CHILD), WM_KEYDOWN, VK_ESCAPE, 0);
+       },
+       RTNIL},
+  };
+  for (size_t i = 0; i < std::size(rows); ++i)
+    EXPECT_EQ(Browse(BrowseArgs(L""), rows[i].first).resultKind, rows[i].second) << "way " << i;
 }
 
 TEST_F(ExplorerFrame, CloseBoxCancelsAfterStoringTheGeometry) {
@@ -161,30 +164,8 @@ TEST_F(ExplorerFrame, CloseBoxCancelsAfterStoringTheGeometry) {
   EXPECT_EQ(IniValue(ini, "SplitterSize"), "150");
 }
 
-TEST_F(ExplorerFrame, PlacementDefaultMovedOrMaximised) {
-  struct Case {
-    int width, height;
-    bool maximised, sized;
-  };
-  for (const Case &c : {Case{0, 0, false, false}, Case{700, 500, false, true}, Case{9000, 9000, true, false}}) {
-    m_state.Write(StateFile(0, c.width, c.height));
-    bool zoomed = false;
-    RECT rect{};
-    Browse(BrowseArgs(L""), [&](HWND frame) {
-      zoomed = IsZoomed(frame);
-      GetWindowRect(frame, &rect);
-      Command(frame, kCancel);
-    });
-    EXPECT_EQ(zoomed, c.maximised) << c.width << "x" << c.height;
-    if (c.sized) {
-      EXPECT_EQ(rect.right - rect.left, c.width);
-      EXPECT_EQ(rect.bottom - rect.top, c.height);
-    }
-  }
-}
-
 TEST_F(ExplorerFrame, AcceptReturnsThePathWithTheFolderSettings) {
-  ScratchFolder scratch("lumvex-accept");
+  ScratchFolder scratch("accept");
   const std::string folder = scratch.Path();
   scratch.File("datains.ini", "[Default Parameters]\r\nLayer=WALLS\r\nLisp command=MYCMD\r\nColor=1\r\n\r\n");
   m_state.Write(StateFile(0, 0, 0, folder, "plan.dwg"));
@@ -228,25 +209,6 @@ TEST_F(ExplorerFrame, HostWindowIsDisabledWhileTheExplorerIsOpen) {
   DestroyWindow(host);
 }
 
-TEST_F(ExplorerFrame, EscapeInAPaneCancels) {
-  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
-    HWND splitter = GetDlgItem(frame, 0xE900);
-    HWND left = GetDlgItem(splitter, 0xE900);
-    PostMessageA(GetWindow(left, GW_CHILD), WM_KEYDOWN, VK_ESCAPE, 0);  // the folder tree
-  });
-  EXPECT_EQ(outcome.resultKind, RTNIL);
-}
-}  // namespace
-
-namespace {
-constexpr int kAppExit = 0xE141;
-constexpr int kAppAbout = 0xE140;
-constexpr int kViewToolbar = 0xE800;
-constexpr int kViewStatusBar = 0xE801;
-constexpr int kEditCopy = 0xE122;
-constexpr int kEditCut = 0xE123;
-constexpr int kEditPaste = 0xE125;
-
 void PutFileListOnClipboard(const std::string &path) {
   const size_t bytes = sizeof(DROPFILES) + path.size() + 2;
   HGLOBAL block = GlobalAlloc(GMEM_MOVEABLE | GMEM_ZEROINIT, bytes);
@@ -268,10 +230,6 @@ void PutTextOnClipboard(const char *text) {
   EmptyClipboard();
   SetClipboardData(CF_TEXT, block);
   CloseClipboard();
-}
-
-TEST_F(ExplorerFrame, FileExitCancels) {
-  EXPECT_EQ(Browse(BrowseArgs(L""), [](HWND frame) { Command(frame, kAppExit); }).resultKind, RTNIL);
 }
 
 TEST_F(ExplorerFrame, ToolBarAndStatusBarCommandsHideThemAndClearTheirCheckMarks) {
@@ -297,34 +255,16 @@ TEST_F(ExplorerFrame, ToolBarAndStatusBarCommandsHideThemAndClearTheirCheckMarks
   EXPECT_FALSE(statusChecked);
 }
 
-TEST_F(ExplorerFrame, AboutBoxRunsModallyOverTheFrame) {
-  std::string title;
-  bool frameEnabledDuringAbout = true;
-  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
-    Command(frame, kAppAbout);
-    if (HWND about = WaitForWindow("#32770", "About Lumvex1", 5000)) {
-      title = WindowText(about);
-      frameEnabledDuringAbout = IsWindowEnabled(frame);
-      PostMessageA(about, WM_COMMAND, IDOK, 0);
-      for (int i = 0; i < 100 && IsWindow(about); ++i) Sleep(20);
-    }
-    Command(frame, kCancel);
-  });
-  EXPECT_EQ(title, "About Lumvex1");
-  EXPECT_FALSE(frameEnabledDuringAbout);
-  EXPECT_EQ(outcome.resultKind, RTNIL);
-}
-
 TEST_F(ExplorerFrame, CopyWithNothingMarkedPutsAnEmptyFileList) {
   PutTextOnClipboard("before");
-  Browse(BrowseArgs(L""), [](HWND frame) {
+  Browse(BrowseArgs(L""), [&](HWND frame) {
     SendMessageA(frame, WM_COMMAND, kEditCopy, 0);
     Command(frame, kCancel);
   });
   ASSERT_TRUE(OpenClipboard(nullptr));
   HGLOBAL block = GetClipboardData(CF_HDROP);
-  ASSERT_NE(block, nullptr);
   const auto *drop = static_cast<const DROPFILES *>(GlobalLock(block));
+  ASSERT_NE(drop, nullptr);
   EXPECT_EQ(drop->pFiles, 20u);
   EXPECT_FALSE(drop->fWide);
   EXPECT_EQ(*(reinterpret_cast<const char *>(drop) + drop->pFiles), '\0') << "no file in the list";
@@ -332,23 +272,8 @@ TEST_F(ExplorerFrame, CopyWithNothingMarkedPutsAnEmptyFileList) {
   CloseClipboard();
 }
 
-TEST_F(ExplorerFrame, CutLeavesTheClipboardAlone) {
-  PutTextOnClipboard("kept");
-  Browse(BrowseArgs(L""), [](HWND frame) {
-    SendMessageA(frame, WM_COMMAND, kEditCut, 0);
-    Command(frame, kCancel);
-  });
-  ASSERT_TRUE(OpenClipboard(nullptr));
-  EXPECT_FALSE(IsClipboardFormatAvailable(CF_HDROP));
-  HGLOBAL text = GetClipboardData(CF_TEXT);
-  ASSERT_NE(text, nullptr);
-  EXPECT_STREQ(static_cast<const char *>(GlobalLock(text)), "kept");
-  GlobalUnlock(text);
-  CloseClipboard();
-}
-
 TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheLabel) {
-  ScratchFolder source("lumvex-paste-source");
+  ScratchFolder source("paste-source");
   const std::string drawing = source.File("door.dwg", "AC1018");
   struct Case {
     const char *settings;  // nullptr: no datains.ini
@@ -357,7 +282,7 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
   for (const Case &c :
        {Case{nullptr, " Layer name: Current"}, Case{"[Default Parameters]\r\nLayer=\r\nColor=3\r\n", " Layer name: Current"},
         Case{"[Default Parameters]\r\nLayer=WALLS\r\n", " Layer name: WALLS"}}) {
-    ScratchFolder target("lumvex-paste-target");
+    ScratchFolder target("paste-target");
     const std::string folder = target.Path();
     if (c.settings) target.File("datains.ini", c.settings);
     m_state.Write(StateFile(0, 0, 0, folder));
@@ -377,11 +302,6 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
     EXPECT_NE(GetFileAttributesA((folder + "\\door.dwg").c_str()), INVALID_FILE_ATTRIBUTES) << "the drawing was pasted";
   }
 }
-}  // namespace
-
-namespace {
-constexpr int kHelp = 0xE146;
-
 std::string StatusText(HWND frame) {
   char text[128] = "";
   SendMessageA(FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr), SB_GETTEXTA, 0, reinterpret_cast<LPARAM>(text));
@@ -428,11 +348,4 @@ TEST_F(ExplorerFrame, FrameAcceleratorsWorkInsideTheModalLoop) {
   EXPECT_EQ(focus, rightPane) << "focus on a " << focusClass << " id " << GetDlgCtrlID(focus);
 }
 
-TEST_F(ExplorerFrame, HelpWithoutAHelpFileChangesNothing) {
-  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
-    SendMessageA(frame, WM_COMMAND, kHelp, 0);
-    Command(frame, kCancel);
-  });
-  EXPECT_EQ(outcome.resultKind, RTNIL);
-}
 }  // namespace

@@ -1,4 +1,4 @@
-# The framework's controls, bars and menus, with a resource script drawn over the module's
+# The framework's controls and bars, with a resource script drawn over the module's
 # own tool bar picture.
 target_sources(FwControlsTest PRIVATE
   ${CMAKE_CURRENT_SOURCE_DIR}/FwControlsTest.rc

@@ -70,17 +70,6 @@ TEST_F(ScrollViewTest, ScrollSizesSetTheBarsThatTheContentNeeds) {
   EXPECT_FALSE(style & WS_HSCROLL);  // 380 still fits beside the vertical bar
   EXPECT_EQ(1600, view.GetTotalSize().cy);
 
-  int mapMode = 0;
-  SIZE total{}, page{}, line{};
-  view.SetScrollSizes(MM_TEXT, SIZE{1000, 2000});
-  view.GetDeviceScrollSizes(mapMode, total, page, line);
-  EXPECT_EQ(MM_TEXT, mapMode);
-  EXPECT_EQ(100, page.cx);  // a tenth of the total
-  EXPECT_EQ(200, page.cy);
-  EXPECT_EQ(10, line.cx);  // a tenth of the page
-  EXPECT_EQ(20, line.cy);
-  EXPECT_TRUE(GetWindowLongA(view, GWL_STYLE) & WS_HSCROLL);
-  EXPECT_THROW(view.SetScrollSizes(MM_LOENGLISH, SIZE{10, 10}), std::invalid_argument);
 }
 
 TEST_F(ScrollViewTest, ScrollToPositionMovesTheChildrenAndStaysInTheRange) {

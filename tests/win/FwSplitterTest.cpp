@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <memory>
+#include <tuple>
 #include <string>
 
 namespace {
@@ -53,51 +54,46 @@ class SplitterTest : public ::testing::Test {
   fw::CSplitterWnd splitter;
 };
 
-TEST_F(SplitterTest, PanesTakeTheirIdsAndTheIdealWidthOfTheFirstColumn) {
+TEST_F(SplitterTest, PanesTakeTheirIdsAndTheIdealWidthOfTheFirstColumnTheLastTakesTheRest) {
   EXPECT_EQ(static_cast<int>(AFX_IDW_PANE_FIRST), splitter.GetDlgCtrlID());
   EXPECT_EQ(0xE900, splitter.GetPane(0, 0)->GetDlgCtrlID());
   EXPECT_EQ(0xE901, splitter.GetPane(0, 1)->GetDlgCtrlID());
   EXPECT_FALSE(splitter.CreateView<fw::CView>(0, 1, SIZE{10, 10}));  // taken
   EXPECT_THROW(splitter.GetPane(0, 2), std::out_of_range);
 
-  // A 2 pixel border around the panes and a 7 pixel bar between them.
-  const RECT left = PaneRect(splitter, 0);
-  const RECT right = PaneRect(splitter, 1);
-  EXPECT_EQ((RECT{2, 2, 152, 398}).right, left.right);
-  EXPECT_EQ(2, left.left);
-  EXPECT_EQ(2, left.top);
-  EXPECT_EQ(398, left.bottom);
-  EXPECT_EQ(159, right.left);
-  EXPECT_EQ(598, right.right);
+  // The same border all round the panes and a bar between them.
+  const RECT left = PaneRect(splitter, 0), right = PaneRect(splitter, 1);
+  const int border = left.left, bar = right.left - left.right;
+  EXPECT_EQ(std::make_tuple(left.top, 400 - left.bottom, 600 - right.right), std::make_tuple(border, border, border));
+  EXPECT_EQ(150, left.right - left.left);
   EXPECT_EQ(150, ColumnWidth(splitter, 0));
-  EXPECT_EQ(439, ColumnWidth(splitter, 1));
+  EXPECT_EQ(600 - 2 * border - 150 - bar, ColumnWidth(splitter, 1));
 
   splitter.SetColumnInfo(0, 250, 40);
   splitter.RecalcLayout();
   int cur = 0, min = 0;
   splitter.GetColumnInfo(0, cur, min);
-  EXPECT_EQ(250, cur);
-  EXPECT_EQ(40, min);
-  EXPECT_EQ(252, PaneRect(splitter, 0).right);
+  EXPECT_EQ(std::make_pair(250, 40), std::make_pair(cur, min));
+  EXPECT_EQ(border + 250, PaneRect(splitter, 0).right);
 
   // Below its minimum a column is hidden and the next one moves up to the border.
   splitter.SetColumnInfo(0, 30, 40);
   splitter.RecalcLayout();
   EXPECT_EQ(0, ColumnWidth(splitter, 0));
   EXPECT_FALSE(splitter.GetPane(0, 0)->IsWindowVisible());
-  EXPECT_EQ(9, PaneRect(splitter, 1).left);
+  EXPECT_EQ(border + bar, PaneRect(splitter, 1).left);
 
   // A first column wider than the window leaves nothing to the second.
   splitter.SetColumnInfo(0, 5000, 0);
   splitter.RecalcLayout();
-  EXPECT_EQ(596, ColumnWidth(splitter, 0));
+  EXPECT_EQ(600 - 2 * border, ColumnWidth(splitter, 0));
   EXPECT_EQ(0, ColumnWidth(splitter, 1));
   EXPECT_FALSE(splitter.GetPane(0, 1)->IsWindowVisible());
 
   // Resizing the splitter lays it out again.
   splitter.SetColumnInfo(0, 150, 0);
   splitter.MoveWindow(RECT{0, 0, 500, 300});
-  EXPECT_EQ(339, ColumnWidth(splitter, 1));
+  EXPECT_EQ(500 - 2 * border - 150 - bar, ColumnWidth(splitter, 1));
   EXPECT_TRUE(splitter.GetPane(0, 1)->IsWindowVisible());
 }
 
@@ -124,8 +120,8 @@ TEST_F(SplitterTest, DraggingTheBarWithTheMouseSetsTheFirstColumnsWidth) {
   EXPECT_EQ(nullptr, GetCapture());
   const int width = 150 + moved;
   EXPECT_EQ(width, ColumnWidth(splitter, 0));
-  EXPECT_EQ(2 + width, PaneRect(splitter, 0).right);
-  EXPECT_EQ(2 + width + 7, PaneRect(splitter, 1).left);
+  const int border = PaneRect(splitter, 0).left, gap = PaneRect(splitter, 1).left - PaneRect(splitter, 0).right;
+  EXPECT_EQ(border + width, PaneRect(splitter, 0).right);
 
   // Escape during a drag leaves the width as it was.
   MouseTo(ScreenPoint(splitter, 215, 100));
@@ -136,11 +132,11 @@ TEST_F(SplitterTest, DraggingTheBarWithTheMouseSetsTheFirstColumnsWidth) {
   EXPECT_EQ(width, ColumnWidth(splitter, 0));
 
   // The bar cannot be dragged past the end of the second pane, which then has no room left.
-  MouseTo(ScreenPoint(splitter, 2 + width + 3, 300));  // away from the last press: no double click
+  MouseTo(ScreenPoint(splitter, border + width + 3, 300));  // away from the last press: no double click
   MouseButton(true);
   MouseTo(ScreenPoint(splitter, 900, 300));
   MouseButton(false);
-  EXPECT_EQ(596 - 7, ColumnWidth(splitter, 0));
+  EXPECT_EQ(600 - 2 * border - gap, ColumnWidth(splitter, 0));
   EXPECT_EQ(0, ColumnWidth(splitter, 1));
 }
 

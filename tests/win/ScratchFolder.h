@@ -11,27 +11,34 @@
 class ScratchFolder {
  public:
   explicit ScratchFolder(const char *tag)
-      : m_path(std::filesystem::temp_directory_path() / (std::string(tag) + "-" + std::to_string(GetTickCount64()))) {
+      : m_path((std::filesystem::temp_directory_path() /
+                (std::string("lumvex-") + tag + "-" + std::to_string(GetCurrentProcessId()) + "-" +
+                 std::to_string(GetTickCount64())))
+                   .string()) {
     std::filesystem::create_directories(m_path);
   }
   ~ScratchFolder() {
+    // A folder scan makes the folder current, and the current folder cannot be removed.
+    char current[MAX_PATH] = "";
+    GetCurrentDirectoryA(MAX_PATH, current);
+    if (m_path == current) SetCurrentDirectoryA("C:\\");
     std::error_code ignored;
     std::filesystem::remove_all(m_path, ignored);
   }
   ScratchFolder(const ScratchFolder &) = delete;
   ScratchFolder &operator=(const ScratchFolder &) = delete;
 
-  std::string Path() const { return m_path.string(); }
-  // Narrow names are ANSI text, as the module's paths are: kept off std::filesystem's own
-  // conversion.
+  const std::string &Path() const { return m_path; }
+  // The path of a file in the folder, written first when there is content. Narrow names are
+  // ANSI text, as the module's paths are: kept off std::filesystem's own conversion.
   std::string File(const std::string &name, const char *content = nullptr) const {
-    const std::string file = m_path.string() + "\\" + name;
+    const std::string file = m_path + "\\" + name;
     if (content) std::ofstream(file.c_str(), std::ios::binary) << content;
     return file;
   }
 
  private:
-  std::filesystem::path m_path;
+  std::string m_path;
 };
 
 inline std::string Content(const std::string &path) {
