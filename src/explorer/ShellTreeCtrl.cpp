@@ -199,6 +199,9 @@ BOOL CShellTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, L
         // Given the focus with nothing selected, the tree selects its first item by itself: no
         // folder is scanned until the person, or the start path, chooses one.
         *result = tree->action == TVC_UNKNOWN && !tree->itemOld.hItem && tree->itemNew.hItem != GetStartItem();
+        // The highlight marks the folder shown even when the tree has no focus. It moves now:
+        // Wine's tree ignores a highlight asked for the item already selected.
+        if (!*result) Select(tree->itemNew.hItem, TVGN_DROPHILITE);
         return TRUE;
       case TVN_KEYDOWN:
       case NM_SETFOCUS:
@@ -222,7 +225,6 @@ void CShellTreeCtrl::OnGetDispInfo(TVITEMA &item) const {
 void CShellTreeCtrl::OnSelChanged(HTREEITEM item) {
   if (g_pMainFrame) g_pMainFrame->EnableAccept(false);
   LoadFolder(item, ".dwg");
-  Select(item, TVGN_DROPHILITE);
   if (g_pThumbView) g_pThumbView->ReloadFolder();
   SetFocus();
 }
