@@ -110,7 +110,7 @@ check "the keys choose the next folder once the load is done" "$plans\\Details" 
 keys "$frame" Tab
 finish "first browse"
 
-settings() {  # settings: right click on the shown folder's tree item (found by its highlight) and choose the menu
+highlight() {  # highlight: the highlighted tree items' box on the screen, as X Y WIDTH HEIGHT
   local X Y WIDTH HEIGHT w h x y
   for _ in $(seq 20); do  # until the frame has settled where it is shown
     eval "$(xdotool getwindowgeometry --shell "$frame" 2>/dev/null)"
@@ -120,9 +120,15 @@ settings() {  # settings: right click on the shown folder's tree item (found by 
     [ "$w" -gt 0 ] && break
     sleep 0.25
   done
-  xdotool mousemove $((X + x + w / 2)) $((Y + 60 + y + h / 2)) click 3 sleep 0.5
+  echo $((X + x)) $((Y + 60 + y)) "$w" "$h"
+}
+
+settings() {  # settings: right click on the shown folder's tree item and choose the menu
+  local x y w h
+  read -r x y w h < <(highlight)
+  xdotool mousemove $((x + w / 2)) $((y + h / 2)) click 3 sleep 0.5
   # The menu opens at the item's lower right corner.
-  xdotool mousemove $((X + x + w + 40)) $((Y + 60 + y + h + 11)) click 1
+  xdotool mousemove $((x + w + 40)) $((y + h + 11)) click 1
   dialog=$(window '^Folder settings$')
 }
 ini="$work/Plans/Details/datains.ini"
@@ -147,6 +153,10 @@ check "the accepted drawing carries the folder's defaults" \
 
 browse ""
 frame=$(window 'plan.dwg$')
+shown=$(highlight)
+read -r x y _ h <<<"$shown"
+xdotool mousemove $((x + 10)) $((y + h / 2 - 16)) click 3 sleep 0.5 key Escape  # Archive, just above
+check "another folder's menu leaves the highlight on the folder shown" "$shown" "$(highlight)"
 settings
 keys "$dialog" alt+u Tab BackSpace Return
 check "current layer without a command removes datains.ini" "removed" "$([ -e "$ini" ] || echo removed)"
