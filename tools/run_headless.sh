@@ -35,22 +35,22 @@ fail() {
 }
 
 wait_for_window() {  # wait_for_window TITLE-REGEX: the visible window so named, or nothing after 20 s
-  local window=""
   for _ in $(seq 100); do
-    window=$(xdotool search --onlyvisible --name "$1" 2>/dev/null | head -n 1 || true)
-    [ -n "$window" ] && break
+    xdotool search --onlyvisible --name "$1" >/dev/null 2>&1 && break
     sleep 0.2
   done
-  echo "$window"
+  # Wine may replace a window's X window while it is being shown: the settled one counts.
+  sleep 0.5
+  xdotool search --onlyvisible --name "$1" 2>/dev/null | head -n 1 || true
 }
 
 # The frame's title is the folder shown, or the drawing chosen in it.
-titled() {  # titled TITLE-REGEX: waits until the explorer's title matches
-  for _ in $(seq 100); do
+titled() {  # titled TITLE-REGEX [SECONDS]: whether the explorer's title comes to match (in 20 s)
+  for _ in $(seq $((${2:-20} * 5))); do
     [[ "$(xdotool getwindowname "$explorer" 2>/dev/null)" =~ $1 ]] && return 0
     sleep 0.2
   done
-  fail "the explorer's title never matched $1"
+  return 1
 }
 
 key() {  # key WINDOW KEY...
@@ -66,17 +66,21 @@ host=$!
 
 explorer=$(wait_for_window "^$drive:\\\\\$")
 [ -n "$explorer" ] || fail "the explorer did not open"
-sleep 0.5
-# The drive is chosen and open: down to Details, which shows its drawings, and open it.
-key "$explorer" Down
-titled '\\Details$'
+# The drive is chosen and open: down to Details, which shows its drawings, and open it. A key
+# that comes while the new explorer is still taking the focus is lost: it is sent again while
+# the drive is shown.
+for _ in 1 2 3; do
+  key "$explorer" Down
+  titled '\\Details$' 5 && break
+done
+titled '\\Details$' 1 || fail "the explorer did not show Details"
 key "$explorer" Right
 
 # The second drawing of the top row in the thumbnail view (178 pixels apart), then the accept
 # button. The pointer leaves the tile first, so that its tooltip does not hide the others.
 eval "$(xdotool getwindowgeometry --shell "$explorer")"
 xdotool mousemove $((X + splitter + 100 + 178)) $((Y + 150)) click 1 2>/dev/null
-titled '\\Details\\[^\\]+\.[dD][wW][gG]$'
+titled '\\Details\\[^\\]+\.[dD][wW][gG]$' || fail "the click did not choose a drawing"
 xdotool mousemove $((X + WIDTH - 100)) $((Y + HEIGHT - 100)) 2>/dev/null
 sleep 1
 import -window root -crop "${WIDTH}x${HEIGHT}+${X}+${Y}" +repage "$shots/explorer.png"
@@ -88,7 +92,6 @@ for _ in $(seq 50); do
 done
 xdotool search --onlyvisible --name "^$drive:" >/dev/null 2>&1 && fail "the browse did not end on Insert"
 hostWindow=$(wait_for_window '^Lumvex development host$')
-sleep 0.5
 key "$hostWindow" alt+F4
 for _ in $(seq 50); do
   kill -0 "$host" 2>/dev/null || break
