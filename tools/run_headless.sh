@@ -1,8 +1,9 @@
 #!/usr/bin/env bash
 # A short browse on a display nobody looks at (Xvfb), driven with real X input as a person
-# would: the explorer opens on the samples drive, a sub-folder is chosen and expanded, the
-# drive is chosen again, a drawing is clicked and accepted. A screenshot is saved on the way
-# and the host's command line, the result list included, is printed.
+# would: the explorer opens on the samples drive, its sub-folder Details is chosen and expanded,
+# a drawing there is clicked and accepted with the Insert button. SCREENSHOT_DIR/explorer.png
+# shows the explorer with the drawing chosen; the host's command line, with the result list, is
+# printed.
 # Usage: run_headless.sh DEVHOST_EXE DRIVE_LETTER SCREENSHOT_DIR
 set -euo pipefail
 exe=$1
@@ -14,7 +15,9 @@ state="$bin/Lumvex1.ini"
 work=$(mktemp -d)
 saved=""
 [ -f "$state" ] && saved="$work/state.ini" && cp "$state" "$saved"
+host=""
 cleanup() {
+  [ -n "$host" ] && kill "$host" 2>/dev/null
   if [ -n "$saved" ]; then cp "$saved" "$state"; else rm -f "$state"; fi
   rm -rf "$work"
 }
@@ -22,68 +25,79 @@ trap cleanup EXIT
 
 # A known window size and tree width, so that the drawing and the button can be clicked.
 splitter=260
-printf '[CurrentPath]\r\nPath=\r\nName=\r\nShellPath=\r\n\r\n[Size]\r\nSplitterSize=%s\r\nWindowWidth=1180\r\nWindowHeight=760\r\n\r\n[View]\r\nPictureWidth=0\r\nPictureHeight=0\r\nSort=0\r\n\r\n' \
+printf '[CurrentPath]\r\nPath=\r\nName=\r\nShellPath=\r\n\r\n[Size]\r\nSplitterSize=%s\r\nWindowWidth=1180\r\nWindowHeight=520\r\n\r\n[View]\r\nPictureWidth=0\r\nPictureHeight=0\r\nSort=0\r\n\r\n' \
   "$splitter" >"$state"
+
+fail() {
+  echo "lumvex: $*" >&2
+  cat "$work/out"
+  exit 1
+}
+
+wait_for_window() {  # wait_for_window TITLE-REGEX: the visible window so named, or nothing after 20 s
+  for _ in $(seq 100); do
+    xdotool search --onlyvisible --name "$1" >/dev/null 2>&1 && break
+    sleep 0.2
+  done
+  # Wine may replace a window's X window while it is being shown: the settled one counts.
+  sleep 0.5
+  xdotool search --onlyvisible --name "$1" 2>/dev/null | head -n 1 || true
+}
+
+# The frame's title is the folder shown, or the drawing chosen in it.
+titled() {  # titled TITLE-REGEX [SECONDS]: whether the explorer's title comes to match (in 20 s)
+  for _ in $(seq $((${2:-20} * 5))); do
+    [[ "$(xdotool getwindowname "$explorer" 2>/dev/null)" =~ $1 ]] && return 0
+    sleep 0.2
+  done
+  return 1
+}
+
+key() {  # key WINDOW KEY...
+  xdotool windowfocus --sync "$1" >/dev/null 2>&1 || true
+  shift
+  xdotool key --clearmodifiers "$@" 2>/dev/null
+  sleep 0.4
+}
 
 call="(Lumvex 0 0 \"$drive:\\\\\" \"Insert\" \"Close\")"
 wine "$exe" --layers "0=7;WALLS=1" --eval "$call" >"$work/out" 2>&1 &
 host=$!
 
-wait_for_window() {
-  local name=$1 window=""
-  for _ in $(seq 100); do
-    window=$(xdotool search --onlyvisible --name "$name" 2>/dev/null | head -n 1 || true)
-    [ -n "$window" ] && break
-    sleep 0.2
-  done
-  echo "$window"
-}
-
-key() {  # key WINDOW KEY...
-  local window=$1
-  shift
-  xdotool windowactivate --sync "$window" >/dev/null 2>&1 || xdotool windowfocus "$window" >/dev/null 2>&1 || true
-  xdotool key --clearmodifiers "$@" 2>/dev/null
-  sleep 0.4
-}
-
 explorer=$(wait_for_window "^$drive:\\\\\$")
-if [ -z "$explorer" ]; then
-  echo "lumvex: the explorer did not open" >&2
-  kill "$host" 2>/dev/null || true
-  cat "$work/out"
-  exit 1
-fi
-sleep 0.5
-# The drive is selected and open: down to its first folder, open it, and back to the drive.
-key "$explorer" Down
+[ -n "$explorer" ] || fail "the explorer did not open"
+# The drive is chosen and open: down to Details, which shows its drawings, and open it. A key
+# that comes while the new explorer is still taking the focus is lost: it is sent again while
+# the drive is shown.
+for _ in 1 2 3; do
+  key "$explorer" Down
+  titled '\\Details$' 5 && break
+done
+titled '\\Details$' 1 || fail "the explorer did not show Details"
 key "$explorer" Right
-key "$explorer" Up
-sleep 0.5
 
+# The second drawing of the top row in the thumbnail view (178 pixels apart), then the accept
+# button. The pointer leaves the tile first, so that its tooltip does not hide the others.
 eval "$(xdotool getwindowgeometry --shell "$explorer")"
-shot="$shots/explorer-$(date +%Y%m%d-%H%M%S).png"
-import -window root -crop "${WIDTH}x${HEIGHT}+${X}+${Y}" +repage "$shot"
-echo "screenshot: $shot"
-
-# The first drawing, top left in the thumbnail view, then the accept button.
-xdotool mousemove $((X + splitter + 100)) $((Y + 150)) click 1 2>/dev/null
-sleep 0.5
-xdotool mousemove $((X + 40)) $((Y + HEIGHT - 43)) click 1 2>/dev/null
+xdotool mousemove $((X + splitter + 100 + 178)) $((Y + 150)) click 1 2>/dev/null
+titled '\\Details\\[^\\]+\.[dD][wW][gG]$' || fail "the click did not choose a drawing"
+xdotool mousemove $((X + WIDTH - 100)) $((Y + HEIGHT - 100)) 2>/dev/null
 sleep 1
-# Nothing chosen (no drawing in view): the browse is cancelled instead.
-xdotool search --onlyvisible --name "^$drive:" >/dev/null 2>&1 && key "$explorer" Escape
+import -window root -crop "${WIDTH}x${HEIGHT}+${X}+${Y}" +repage "$shots/explorer.png"
+xdotool mousemove $((X + 40)) $((Y + HEIGHT - 43)) click 1 2>/dev/null
 
+for _ in $(seq 50); do
+  xdotool search --onlyvisible --name "^$drive:" >/dev/null 2>&1 || break
+  sleep 0.2
+done
+xdotool search --onlyvisible --name "^$drive:" >/dev/null 2>&1 && fail "the browse did not end on Insert"
 hostWindow=$(wait_for_window '^Lumvex development host$')
-sleep 0.5
-[ -n "$hostWindow" ] && key "$hostWindow" alt+F4
+key "$hostWindow" alt+F4
 for _ in $(seq 50); do
   kill -0 "$host" 2>/dev/null || break
   sleep 0.2
 done
-if kill -0 "$host" 2>/dev/null; then
-  echo "lumvex: the host did not close on Alt+F4" >&2
-  kill "$host"
-fi
+kill -0 "$host" 2>/dev/null && fail "the host did not close on Alt+F4"
 wait "$host" || true
+host=""
 cat "$work/out"

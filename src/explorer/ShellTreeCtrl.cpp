@@ -199,6 +199,9 @@ BOOL CShellTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, L
         // Given the focus with nothing selected, the tree selects its first item by itself: no
         // folder is scanned until the person, or the start path, chooses one.
         *result = tree->action == TVC_UNKNOWN && !tree->itemOld.hItem && tree->itemNew.hItem != GetStartItem();
+        // The highlight marks the folder shown even when the tree has no focus. It moves now:
+        // Wine's tree ignores a highlight asked for the item once it is selected.
+        if (!*result) Select(tree->itemNew.hItem, TVGN_DROPHILITE);
         return TRUE;
       case TVN_KEYDOWN:
       case NM_SETFOCUS:
@@ -222,22 +225,20 @@ void CShellTreeCtrl::OnGetDispInfo(TVITEMA &item) const {
 void CShellTreeCtrl::OnSelChanged(HTREEITEM item) {
   if (g_pMainFrame) g_pMainFrame->EnableAccept(false);
   LoadFolder(item, ".dwg");
-  Select(item, TVGN_DROPHILITE);
   if (g_pThumbView) g_pThumbView->ReloadFolder();
   SetFocus();
 }
 
 void CShellTreeCtrl::ShowFolderSettingsMenu() {
   // The clicked item is the one the menu is for. Some tree controls leave the drop highlight
-  // where it was during a right click: the click's own position decides then.
+  // where it was during a right click: the click's own position decides then. The highlight
+  // itself stays on the folder shown, as Wine's tree would not give it back to that folder.
   const DWORD position = GetMessagePos();
   TVHITTESTINFO hit{};
   hit.pt = POINT{static_cast<short>(LOWORD(position)), static_cast<short>(HIWORD(position))};
   ScreenToClient(m_hWnd, &hit.pt);
-  if (HitTest(&hit) && (hit.flags & TVHT_ONITEM)) Select(hit.hItem, TVGN_DROPHILITE);
-  RunFolderSettingsMenu(GetDropHilightItem());
-  // The highlight goes back to the folder shown.
-  Select(GetSelectedItem(), TVGN_DROPHILITE);
+  const HTREEITEM clicked = HitTest(&hit);
+  RunFolderSettingsMenu(clicked && (hit.flags & TVHT_ONITEM) ? clicked : GetDropHilightItem());
 }
 
 void CShellTreeCtrl::RunFolderSettingsMenu(HTREEITEM item) {

@@ -2,7 +2,8 @@
 # The folder tree driven with real X input through the development host: a start folder typed
 # in another letter case, the loading animation caught while a folder of 20,000 sub-folders
 # fills, another folder chosen with the keys, Tab over to the thumbnail view and Escape from
-# there, and the next browse opening at the remembered folder.
+# there, the next browses opening at the remembered folder, and its defaults set through a right
+# click on its tree item: taken with an accepted drawing, then dropped with "Use current layer".
 # Usage: tree_test.sh BIN_DIR REPO_ROOT SCREENSHOT_DIR
 set -uo pipefail
 bin=$1
@@ -24,6 +25,7 @@ cleanup() {
 trap cleanup EXIT
 mkdir -p "$shots" "$work/Plans/Details"
 (cd "$work/Plans" && mkdir -p Archive && cd Archive && seq -f 'f%05g' 20000 | xargs mkdir)
+python3 "$root/tools/make_sample_drawings.py" "$work/one" 1 >/dev/null && mv "$work"/one/* "$work/Plans/Details/plan.dwg"
 plans="Z:${work//\//\\}\\Plans"
 
 check() {
@@ -71,12 +73,16 @@ named() {  # named WINDOW EXPECTED: the window's title once it reads EXPECTED (o
   echo "$name"
 }
 
-finish() {  # finish NAME: Escape in the tree ends the browse with nil
-  keys "$frame" Escape
+ended() {  # ended: what the host printed once the browse has ended (or been ended after 5 s)
   for _ in $(seq 50); do kill -0 "$host" 2>/dev/null || break; sleep 0.1; done
   kill -0 "$host" 2>/dev/null && kill "$host"
   wait "$host"
-  check "$1: Escape gives nil" "nil" "$(cat "$work/out")"
+  tr -d '\r' <"$work/out"
+}
+
+finish() {  # finish NAME: Escape in the tree ends the browse with nil
+  keys "$frame" Escape
+  check "$1: Escape gives nil" "nil" "$(ended)"
 }
 
 printf '[Size]\r\nSplitterSize=260\r\nWindowWidth=1000\r\nWindowHeight=700\r\n' >"$state"
@@ -104,11 +110,57 @@ check "the keys choose the next folder once the load is done" "$plans\\Details" 
 keys "$frame" Tab
 finish "first browse"
 
+highlight() {  # highlight: the highlighted tree items' box on the screen, as X Y WIDTH HEIGHT
+  local X Y WIDTH HEIGHT w h x y
+  for _ in $(seq 20); do  # until the frame has settled where it is shown
+    eval "$(xdotool getwindowgeometry --shell "$frame" 2>/dev/null)"
+    import -window root "$shots/tree-settings.png"
+    IFS='x+' read -r w h x y < <(convert "$shots/tree-settings.png" -crop "260x$((HEIGHT - 160))+$X+$((Y + 60))" \
+      +repage -fill black +opaque 'rgb(48,150,250)' -format '%@' info: 2>/dev/null)
+    [ "$w" -gt 0 ] && break
+    sleep 0.25
+  done
+  echo $((X + x)) $((Y + 60 + y)) "$w" "$h"
+}
+
+settings() {  # settings: right click on the shown folder's tree item and choose the menu
+  local x y w h
+  read -r x y w h < <(highlight)
+  xdotool mousemove $((x + w / 2)) $((y + h / 2)) click 3 sleep 0.5
+  # The menu opens at the item's lower right corner.
+  xdotool mousemove $((x + w + 40)) $((y + h + 11)) click 1
+  dialog=$(window '^Folder settings$')
+}
+ini="$work/Plans/Details/datains.ini"
+
 browse ""
-title='Details$'
-frame=$(window "$title")
+frame=$(window 'Details$')
 check "the next browse opens at the remembered folder" "$plans\\Details" "$(xdotool getwindowname "$frame" 2>/dev/null)"
-finish "second browse"
+settings
+keys "$dialog" alt+u shift+Tab
+xdotool type --delay 80 WALLS
+keys "$dialog" Tab Tab
+xdotool type --delay 80 MYCMD
+eval "$(xdotool getwindowgeometry --shell "$dialog" 2>/dev/null | sed 's/^/D/')"
+xdotool mousemove $((DX + DWIDTH * 193 / 212)) $((DY + 44)) click 1  # the colour swatch
+keys "$(window '^Select Color$')" 1 Return
+keys "$dialog" Return
+check "folder settings saved" "[Default Parameters] Layer=WALLS Lisp command=MYCMD Color=1" "$(tr -d '\r' <"$ini" | xargs)"
+eval "$(xdotool getwindowgeometry --shell "$frame" 2>/dev/null)"
+xdotool mousemove $((X + 360)) $((Y + 150)) click --repeat 2 --delay 80 1
+check "the accepted drawing carries the folder's defaults" \
+  "(\"${plans//\\/\\\\}\\\\Details\\\\plan.dwg\" (\"WALLS\" \"1\" \"MYCMD\"))" "$(ended)"
+
+browse ""
+frame=$(window 'plan.dwg$')
+shown=$(highlight)
+read -r x y _ h <<<"$shown"
+xdotool mousemove $((x + 10)) $((y + h / 2 - 16)) click 3 sleep 0.5 key Escape  # Archive, just above
+check "another folder's menu leaves the highlight on the folder shown" "$shown" "$(highlight)"
+settings
+keys "$dialog" alt+u Tab BackSpace Return
+check "current layer without a command removes datains.ini" "removed" "$([ -e "$ini" ] || echo removed)"
+finish "third browse"
 
 echo "e2e tree: $passed passed, $failed failed"
 [ "$failed" -eq 0 ]

@@ -59,7 +59,7 @@ TEST_F(ShellTree, OpensAlongTheStartFolderInAnyCaseThenAlongTheRememberedPath) {
   std::transform(upper.begin(), upper.end(), upper.begin(), [](unsigned char c) { return std::toupper(c); });
 
   for (const std::string &start : {upper, std::string()}) {
-    std::string selected, current, emptyButton = "?";
+    std::string selected, current, highlighted, emptyButton = "?";
     std::vector<std::string> children;
     Browse(BrowseArgs(std::wstring(start.begin(), start.end()).c_str()), [&](HWND frame) {
       HWND tree = FindTree(frame);
@@ -69,6 +69,9 @@ TEST_F(ShellTree, OpensAlongTheStartFolderInAnyCaseThenAlongTheRememberedPath) {
       GetCurrentDirectoryA(MAX_PATH, directory);
       current = directory;
       children = ChildTexts(tree, caret);
+      SendMessageA(tree, TVM_SELECTITEM, TVGN_CARET, reinterpret_cast<LPARAM>(ChildNamed(tree, caret, "b")));
+      highlighted = ItemText(tree, TreeNext(tree, nullptr, TVGN_DROPHILITE));
+      SendMessageA(tree, TVM_SELECTITEM, TVGN_CARET, reinterpret_cast<LPARAM>(caret));
       HTREEITEM empty = ChildNamed(tree, caret, "A");
       SendMessageA(tree, TVM_EXPAND, TVE_EXPAND, reinterpret_cast<LPARAM>(empty));
       TVITEMA button{};
@@ -82,6 +85,7 @@ TEST_F(ShellTree, OpensAlongTheStartFolderInAnyCaseThenAlongTheRememberedPath) {
     EXPECT_EQ(selected, "Plans") << how;
     EXPECT_EQ(Lower(current), Lower(plans)) << how;
     EXPECT_EQ(children, (std::vector<std::string>{"A", "b", "C"})) << how << ": the shell's order";
+    EXPECT_EQ(highlighted, "b") << how << ": the highlight follows the folder chosen";
     EXPECT_EQ(emptyButton, "0") << how << ": a fixed-drive folder found empty";
   }
 }
