@@ -326,7 +326,9 @@ TEST_F(ThumbView, TheTooltipNamesSizeAndDateOfEachTile) {
         [](HWND hwnd, LPARAM found) { return reinterpret_cast<std::vector<HWND> *>(found)->push_back(hwnd), TRUE; },
         reinterpret_cast<LPARAM>(&windows));
     char buffer[256] = "";
-    HWND tile = Tiles(view)[0].hwnd;
+    const std::vector<Tile> tiles = Tiles(view);
+    ASSERT_EQ(tiles.size(), 1u);
+    HWND tile = tiles[0].hwnd;
     TTTOOLINFOA tool{sizeof tool, 0, tile, reinterpret_cast<UINT_PTR>(tile), {}, nullptr, buffer, 0, nullptr};
     for (HWND tip : windows)
       if (!*buffer) SendMessageA(tip, TTM_GETTEXTA, sizeof buffer, reinterpret_cast<LPARAM>(&tool));
