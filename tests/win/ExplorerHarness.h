@@ -6,7 +6,6 @@
 
 #include <windows.h>
 #include <commctrl.h>
-#include <gtest/gtest.h>
 #include <ole2.h>
 #include <shlobj.h>
 
@@ -135,6 +134,9 @@ inline resbuf *BrowseArgs(const wchar_t *folder, const wchar_t *accept = L"Inser
   return acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, folder, RTSTR, accept, RTSTR, cancel, 0);
 }
 
+#if __has_include(<gtest/gtest.h>)  // the benchmarks that share this header build without gtest
+#include <gtest/gtest.h>
+
 // Browse calls of the module loaded into the host, with OLE initialised on the host's thread as
 // the CAD application has it, and the state file as it was before the test.
 class BrowseTest : public ::testing::Test {
@@ -145,6 +147,7 @@ class BrowseTest : public ::testing::Test {
   StateFileGuard m_state;
   LoadedModule m_module;
 };
+#endif
 
 // Puts one file on the clipboard as an ANSI file list, as the shell's copy does.
 inline void PutFileOnClipboard(const std::string &path) {
