@@ -42,28 +42,22 @@ check() {  # check NAME EXPECTED ACTUAL
   fi
 }
 
-host --batch --eval '(Lumvex 0)'
-check "missing arguments: stdout" $'\nMissing parametrs\n.' "$(cat "$work/out"; echo .)"
-check "missing arguments: alert" 'alert: \nMissing parametrs\n' "$(alerts)"
-check "missing arguments: exit code" 0 "$(cat "$work/rc")"
-
-host --batch --eval '(Lumvex 0 0 1 "" "")'
-check "wrong type: stdout" $'\nArgument should be an short' "$(cat "$work/out")"
-check "wrong type: alert" 'alert: \nArgument should be an short' "$(alerts)"
-
-host --batch --eval '(Lumvex 0 0 "" "" "")' --eval '(Lumvex 0 0 "" "" "" 7)'
-check "well-typed calls give nil" $'nil\nnil\n.' "$(cat "$work/out"; echo .)"
-check "well-typed calls alert nothing" "" "$(alerts)"
-
-host --batch --eval '(setq x (list 1 2.5 "a\\b" (list "c")))' --eval '(cadr x)'
-check "setq and cadr" $'(1 2.5 "a\\\\b" ("c"))\n2.5' "$(cat "$work/out")"
+# Missing arguments, a wrong type and a well-typed call inside a list: the same run is then
+# made through ./lumvex devhost.
+calls=(--batch --eval '(Lumvex 0)' --eval '(Lumvex 0 0 1 "" "")' --eval '(list "x" (Lumvex 0 0 "" "" "" 7))')
+host "${calls[@]}"
+check "argument checks: stdout" $'\nMissing parametrs\n\nArgument should be an short\n("x" nil)\n.' "$(cat "$work/out"; echo .)"
+check "argument checks: alerts" 'alert: \nMissing parametrs\n'$'\n''alert: \nArgument should be an short' "$(alerts)"
+check "argument checks: exit code" 0 "$(cat "$work/rc")"
+direct_out=$(cat "$work/out")
+direct_alerts=$(alerts)
 
 # Text outside ASCII leaves as UTF-8 on both streams, whatever the ANSI code page.
 host --batch --module 'C:\nö\such.arx'
 check "UTF-8 on standard error" 'devhost: cannot load C:\nö\such.arx: the file is missing or is not a loadable module' \
   "$(cat "$work/err")"
-host --batch --eval '(princ "ä")' --eval '(list "é" "図")'
-check "UTF-8 on standard output" $'ä\n"ä"\n("é" "図")' "$(cat "$work/out")"
+host --batch --eval '(princ "ä")' --eval '(list "é" "図")' --eval '(setq x (list 1 2.5 "a\\b" (list "c")))' --eval '(cadr x)'
+check "UTF-8 on standard output, setq and cadr" $'ä\n"ä"\n("é" "図")\n(1 2.5 "a\\\\b" ("c"))\n2.5' "$(cat "$work/out")"
 
 host --batch --eval '(car (list 1' --eval '(foo 1)' --eval '"still here"'
 check "errors are reported and evaluation goes on" \
@@ -72,6 +66,7 @@ check "errors do not change the exit code" 0 "$(cat "$work/rc")"
 
 host --batch --eval '(princ "abc")' --eval '(Lumvex 0 0 "" "" "")'
 check "printed text then results on their own lines" $'abc\n"abc"\nnil' "$(cat "$work/out")"
+check "a well-typed call alerts nothing" "" "$(alerts)"
 
 host --batch --drawings 0 --eval '(Lumvex 0 0 "" "" "")'
 check "no drawing, no function" '; error: no function definition: LUMVEX' "$(cat "$work/out")"
@@ -89,10 +84,7 @@ check "a DLL that is no module is refused" 2 "$(cat "$work/rc")"
 host --batch --frobnicate
 check "unknown option" 64 "$(cat "$work/rc")"
 
-host --batch --eval '(Lumvex 0 0 1 "" "")' --eval '(list "x" (Lumvex 0 0 "" "" ""))'
-direct_out=$(cat "$work/out")
-direct_alerts=$(alerts)
-"$root/lumvex" devhost --batch --eval '(Lumvex 0 0 1 "" "")' --eval '(list "x" (Lumvex 0 0 "" "" ""))' >"$work/out" 2>"$work/err" &
+"$root/lumvex" devhost "${calls[@]}" >"$work/out" 2>"$work/err" &
 cancel_explorers $!
 wait $!
 check "./lumvex devhost: same stdout" "$direct_out" "$(cat "$work/out")"

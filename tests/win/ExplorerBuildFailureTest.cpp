@@ -4,7 +4,6 @@
 #include "ExplorerHarness.h"
 
 #include <gtest/gtest.h>
-#include <ole2.h>
 
 #include <atomic>
 
@@ -38,17 +37,14 @@ class RefusedWindowClass {
 class HangBreaker {
  public:
   HangBreaker() : m_thread(GetCurrentThreadId()), m_watch([this] { Watch(); }) {}
-  ~HangBreaker() { Stop(); }
+  ~HangBreaker() { Broke(); }
   bool Broke() {
-    Stop();
+    m_bDone = true;
+    if (m_watch.joinable()) m_watch.join();
     return m_bBroke;
   }
 
  private:
-  void Stop() {
-    m_bDone = true;
-    if (m_watch.joinable()) m_watch.join();
-  }
   void Watch() {
     for (int waited = 0; waited < 8000 && !m_bDone; waited += 50) Sleep(50);
     if (m_bDone) return;
@@ -70,11 +66,9 @@ class HangBreaker {
   std::thread m_watch;
 };
 
-TEST(ExplorerBuildFailure, BrowseEndsAsCancelledWithTheHostEnabledAndTheStateUntouched) {
-  OleInitialize(nullptr);
-  StateFileGuard state;
-  LoadedModule module;
-  ASSERT_EQ(module.LoadResult(), kDevhostLoaded);
+using ExplorerBuildFailure = BrowseTest;
+
+TEST_F(ExplorerBuildFailure, BrowseEndsAsCancelledWithTheHostEnabledAndTheStateUntouched) {
   HWND host = CreateWindowExA(0, "STATIC", "host", WS_OVERLAPPEDWINDOW, 0, 0, 100, 100, nullptr, nullptr, nullptr, nullptr);
   devhostSetWindows(host, nullptr);
   const std::string remembered =
@@ -83,7 +77,7 @@ TEST(ExplorerBuildFailure, BrowseEndsAsCancelledWithTheHostEnabledAndTheStateUnt
 
   // A pane view, a tool bar, the status bar.
   for (const char *refused : {"FwView", TOOLBARCLASSNAMEA, STATUSCLASSNAMEA}) {
-    state.Write(remembered);
+    m_state.Write(remembered);
     int resultKind = 0;
     bool hung = false;
     {
@@ -97,10 +91,9 @@ TEST(ExplorerBuildFailure, BrowseEndsAsCancelledWithTheHostEnabledAndTheStateUnt
     EXPECT_FALSE(hung) << refused << ": the browse never returned";
     EXPECT_EQ(resultKind, RTNIL) << refused;
     EXPECT_TRUE(IsWindowEnabled(host)) << refused;
-    EXPECT_EQ(state.Read(), remembered) << refused;
+    EXPECT_EQ(m_state.Read(), remembered) << refused;
   }
   devhostSetWindows(nullptr, nullptr);
   DestroyWindow(host);
-  OleUninitialize();
 }
 }  // namespace

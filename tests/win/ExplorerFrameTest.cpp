@@ -6,7 +6,6 @@
 #include <gtest/gtest.h>
 #include <shlobj.h>
 
-#include <cstdlib>
 
 namespace {
 constexpr int kAccept = 32795;
@@ -17,7 +16,6 @@ constexpr int kSortBySize = 32789;
 constexpr int kAppExit = 0xE141;
 constexpr int kViewToolbar = 0xE800;
 constexpr int kViewStatusBar = 0xE801;
-constexpr int kEditCopy = 0xE122;
 constexpr int kEditPaste = 0xE125;
 
 std::string StateFile(int sort, int width, int height, const std::string &path = "", const std::string &name = "") {
@@ -38,18 +36,13 @@ std::string IniValue(const std::string &ini, const std::string &key) {
 
 void Command(HWND frame, int id) { PostMessageA(frame, WM_COMMAND, id, 0); }
 
-class ExplorerFrame : public ::testing::Test {
- protected:
-  // The host runs with OLE initialised on its thread, as the CAD application does.
-  static void SetUpTestSuite() { OleInitialize(nullptr); }
-  static void TearDownTestSuite() { OleUninitialize(); }
-  void SetUp() override { ASSERT_EQ(m_module.LoadResult(), kDevhostLoaded); }
-  StateFileGuard m_state;
-  LoadedModule m_module;
-};
+using ExplorerFrame = BrowseTest;
 
 TEST_F(ExplorerFrame, LayoutOfToolBarsLabelsCaptionsAndStatusBar) {
   m_state.Remove();
+  HWND host = CreateWindowExA(0, "STATIC", "host", WS_OVERLAPPEDWINDOW, 0, 0, 100, 100, nullptr, nullptr, nullptr, nullptr);
+  devhostSetWindows(host, nullptr);
+  bool hostEnabledDuring = true;
   std::vector<int> topIds, bottomIds;
   std::vector<std::string> topTexts, bottomTexts;
   std::vector<RECT> captionRects, buttonRects;
@@ -81,8 +74,13 @@ TEST_F(ExplorerFrame, LayoutOfToolBarsLabelsCaptionsAndStatusBar) {
     char text[128] = "";
     SendMessageA(status, SB_GETTEXTA, 0, reinterpret_cast<LPARAM>(text));
     statusText = text;
+    hostEnabledDuring = IsWindowEnabled(host);
     Command(frame, kCancel);
   });
+  EXPECT_FALSE(hostEnabledDuring);
+  EXPECT_TRUE(IsWindowEnabled(host));
+  devhostSetWindows(nullptr, nullptr);
+  DestroyWindow(host);
   ASSERT_TRUE(outcome.watcherFoundFrame);
   EXPECT_EQ(title, "ombra3");
   EXPECT_EQ(topIds, (std::vector<int>{32771, 0, 32774, 0, 32775, 0, 32782, 0, 32804, 32790, 32805}));
@@ -100,17 +98,13 @@ TEST_F(ExplorerFrame, LayoutOfToolBarsLabelsCaptionsAndStatusBar) {
   EXPECT_EQ(statusParts, 4);
   EXPECT_EQ(statusText, "Ready");
   EXPECT_EQ(outcome.resultKind, RTNIL);
-}
 
-TEST_F(ExplorerFrame, DefaultCaptionsAreOkAndCancel) {
-  std::vector<std::string> captions;
+  bottomTexts.clear();  // without captions
   Browse(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", 0), [&](HWND frame) {
-    const std::vector<HWND> bars = ToolBars(frame);
-    if (bars.size() == 2)
-      for (HWND caption : Children(bars[1], "STATIC")) captions.push_back(WindowText(caption));
+    for (HWND caption : Children(ToolBars(frame).back(), "STATIC")) bottomTexts.push_back(WindowText(caption));
     Command(frame, kCancel);
   });
-  EXPECT_EQ(captions, (std::vector<std::string>{"Ok", "Cancel"}));
+  EXPECT_EQ(bottomTexts, (std::vector<std::string>{"Ok", "Cancel"}));
 }
 
 TEST_F(ExplorerFrame, SortMenuChecksTheKeyAndTheSortCommandsSetIt) {
@@ -136,140 +130,73 @@ TEST_F(ExplorerFrame, SortMenuChecksTheKeyAndTheSortCommandsSetIt) {
   }
 }
 
+// Every way of ending the browse stores the frame's size, here changed from the remembered one.
 TEST_F(ExplorerFrame, TheFirstEndMessageDecidesAcceptOrCancel) {
   const std::pair<std::function<void(HWND)>, int> rows[] = {
       {[](HWND frame) { Command(frame, kAccept), PostMessageA(frame, WM_CLOSE, 0, 0); }, RTLB},
       {[](HWND frame) { Command(frame, kCancel), Command(frame, kAccept); }, RTNIL},
       {[](HWND frame) { Command(frame, kAppExit); }, RTNIL},
+      {[](HWND frame) { PostMessageA(frame, WM_SYSCOMMAND, SC_CLOSE, 0); }, RTNIL},  // the close box
       {[](HWND frame) {  // Escape in the folder tree
          PostMessageA(GetWindow(GetDlgItem(GetDlgItem(frame, 0xE900), 0xE900), GW_CHILD), WM_KEYDOWN, VK_ESCAPE, 0);
        },
        RTNIL},
   };
-  for (size_t i = 0; i < std::size(rows); ++i)
-    EXPECT_EQ(Browse(BrowseArgs(L""), rows[i].first).resultKind, rows[i].second) << "way " << i;
+  for (size_t i = 0; i < std::size(rows); ++i) {
+    m_state.Write(StateFile(0, 900, 600));
+    RECT frameRect{};
+    const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+      SetWindowPos(frame, nullptr, 0, 0, 800 + static_cast<int>(i), 500, SWP_NOMOVE | SWP_NOZORDER);
+      GetWindowRect(frame, &frameRect);
+      rows[i].first(frame);
+    });
+    EXPECT_EQ(outcome.resultKind, rows[i].second) << "way " << i;
+    const std::string ini = m_state.Read();
+    EXPECT_EQ(IniValue(ini, "WindowWidth") + "x" + IniValue(ini, "WindowHeight"),
+              std::to_string(frameRect.right - frameRect.left) + "x" + std::to_string(frameRect.bottom - frameRect.top))
+        << "way " << i;
+  }
 }
 
-TEST_F(ExplorerFrame, CloseBoxCancelsAfterStoringTheGeometry) {
-  m_state.Write(StateFile(0, 900, 600));
-  RECT frameRect{};
-  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
-    GetWindowRect(frame, &frameRect);
-    PostMessageA(frame, WM_SYSCOMMAND, SC_CLOSE, 0);
-  });
-  EXPECT_EQ(outcome.resultKind, RTNIL);
-  const std::string ini = m_state.Read();
-  EXPECT_EQ(IniValue(ini, "WindowWidth"), std::to_string(frameRect.right - frameRect.left));
-  EXPECT_EQ(IniValue(ini, "WindowHeight"), std::to_string(frameRect.bottom - frameRect.top));
-  EXPECT_EQ(IniValue(ini, "SplitterSize"), "150");
-}
-
-TEST_F(ExplorerFrame, AcceptReturnsThePathWithTheFolderSettings) {
+TEST_F(ExplorerFrame, AcceptReturnsThePathWithTheFolderSettingsOrThreeEmptyTexts) {
   ScratchFolder scratch("accept");
   const std::string folder = scratch.Path();
   scratch.File("datains.ini", "[Default Parameters]\r\nLayer=WALLS\r\nLisp command=MYCMD\r\nColor=1\r\n\r\n");
-  m_state.Write(StateFile(0, 0, 0, folder, "plan.dwg"));
-  std::string searchText;
-  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
-    const std::vector<HWND> bars = ToolBars(frame);
-    if (!bars.empty())
-      for (HWND edit : Children(bars[0], "EDIT")) searchText = WindowText(edit);
-    Command(frame, kAccept);
-  });
-  ASSERT_EQ(outcome.resultKind, RTLB);
-  ASSERT_EQ(outcome.texts.size(), 4u);
-  EXPECT_EQ(StateFileGuard::Narrow(outcome.texts[0]), folder + "\\") << "the folder gets its separator";
-  EXPECT_EQ(outcome.texts[1], L"WALLS");
-  EXPECT_EQ(outcome.texts[2], L"1");
-  EXPECT_EQ(outcome.texts[3], L"MYCMD");
-  EXPECT_EQ(searchText, "plan") << "the remembered name's base name goes into the search box";
-  const std::string ini = m_state.Read();
-  EXPECT_EQ(IniValue(ini, "Name"), "") << "the remembered name is emptied";
-  EXPECT_EQ(IniValue(ini, "Path"), folder + "\\");
-}
-
-TEST_F(ExplorerFrame, AcceptWithoutFolderSettingsGivesThreeEmptyTexts) {
-  m_state.Write(StateFile(0, 0, 0, "C:\\"));
-  const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) { Command(frame, kAccept); });
-  ASSERT_EQ(outcome.resultKind, RTLB);
-  EXPECT_EQ(outcome.texts, (std::vector<std::wstring>{L"C:\\", L"", L"", L""})) << "C:\\ keeps its one separator";
-}
-
-TEST_F(ExplorerFrame, HostWindowIsDisabledWhileTheExplorerIsOpen) {
-  HWND host = CreateWindowExA(0, "STATIC", "host", WS_OVERLAPPEDWINDOW, 0, 0, 100, 100, nullptr, nullptr, nullptr, nullptr);
-  devhostSetWindows(host, nullptr);
-  bool enabledDuring = true;
-  Browse(BrowseArgs(L""), [&](HWND frame) {
-    enabledDuring = IsWindowEnabled(host);
-    Command(frame, kCancel);
-  });
-  EXPECT_FALSE(enabledDuring);
-  EXPECT_TRUE(IsWindowEnabled(host));
-  devhostSetWindows(nullptr, nullptr);
-  DestroyWindow(host);
-}
-
-void PutFileListOnClipboard(const std::string &path) {
-  const size_t bytes = sizeof(DROPFILES) + path.size() + 2;
-  HGLOBAL block = GlobalAlloc(GMEM_MOVEABLE | GMEM_ZEROINIT, bytes);
-  auto *drop = static_cast<DROPFILES *>(GlobalLock(block));
-  drop->pFiles = sizeof(DROPFILES);
-  memcpy(reinterpret_cast<char *>(drop) + sizeof(DROPFILES), path.c_str(), path.size());
-  GlobalUnlock(block);
-  OpenClipboard(nullptr);
-  EmptyClipboard();
-  SetClipboardData(CF_HDROP, block);
-  CloseClipboard();
-}
-
-void PutTextOnClipboard(const char *text) {
-  HGLOBAL block = GlobalAlloc(GMEM_MOVEABLE, strlen(text) + 1);
-  memcpy(GlobalLock(block), text, strlen(text) + 1);
-  GlobalUnlock(block);
-  OpenClipboard(nullptr);
-  EmptyClipboard();
-  SetClipboardData(CF_TEXT, block);
-  CloseClipboard();
+  const struct {
+    std::string path, name, search;
+    std::vector<std::wstring> texts;
+  } rows[] = {{folder, "plan.dwg", "plan", {std::wstring(folder.begin(), folder.end()) + L"\\", L"WALLS", L"1", L"MYCMD"}},
+              {"C:\\", "", "", {L"C:\\", L"", L"", L""}}};  // C:\ keeps its one separator
+  for (const auto &row : rows) {
+    m_state.Write(StateFile(0, 0, 0, row.path, row.name));
+    std::string searchText;
+    const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+      searchText = WindowText(Children(ToolBars(frame)[0], "EDIT")[0]);
+      Command(frame, kAccept);
+    });
+    EXPECT_EQ(outcome.resultKind, RTLB);
+    EXPECT_EQ(outcome.texts, row.texts);
+    EXPECT_EQ(searchText, row.search) << "the remembered name's base name goes into the search box";
+    EXPECT_EQ(IniValue(m_state.Read(), "Name"), "") << "the remembered name is emptied";
+  }
+  EXPECT_EQ(IniValue(m_state.Read(), "Path"), "C:\\");
 }
 
 TEST_F(ExplorerFrame, ToolBarAndStatusBarCommandsHideThemAndClearTheirCheckMarks) {
-  bool topVisible = true, statusVisible = true, toolbarChecked = true, statusChecked = true, bottomVisible = false;
+  std::vector<bool> shown;  // top bar, bottom bar, status bar, the two check marks
   Browse(BrowseArgs(L""), [&](HWND frame) {
     const std::vector<HWND> bars = ToolBars(frame);
-    HWND status = FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr);
     SendMessageA(frame, WM_COMMAND, kViewToolbar, 0);
     SendMessageA(frame, WM_COMMAND, kViewStatusBar, 0);
     HMENU view = GetSubMenu(GetMenu(frame), 1);
     SendMessageA(frame, WM_INITMENUPOPUP, reinterpret_cast<WPARAM>(view), 1);
-    toolbarChecked = GetMenuState(view, kViewToolbar, MF_BYCOMMAND) & MF_CHECKED;
-    statusChecked = GetMenuState(view, kViewStatusBar, MF_BYCOMMAND) & MF_CHECKED;
-    topVisible = bars.size() == 2 && IsWindowVisible(bars[0]);
-    bottomVisible = bars.size() == 2 && IsWindowVisible(bars[1]);
-    statusVisible = IsWindowVisible(status);
+    shown = {IsWindowVisible(bars[0]) != 0, IsWindowVisible(bars[1]) != 0,
+             IsWindowVisible(FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr)) != 0,
+             (GetMenuState(view, kViewToolbar, MF_BYCOMMAND) & MF_CHECKED) != 0,
+             (GetMenuState(view, kViewStatusBar, MF_BYCOMMAND) & MF_CHECKED) != 0};
     Command(frame, kCancel);
   });
-  EXPECT_FALSE(topVisible);
-  EXPECT_TRUE(bottomVisible) << "the toggle is the top tool bar's";
-  EXPECT_FALSE(statusVisible);
-  EXPECT_FALSE(toolbarChecked);
-  EXPECT_FALSE(statusChecked);
-}
-
-TEST_F(ExplorerFrame, CopyWithNothingMarkedPutsAnEmptyFileList) {
-  PutTextOnClipboard("before");
-  Browse(BrowseArgs(L""), [&](HWND frame) {
-    SendMessageA(frame, WM_COMMAND, kEditCopy, 0);
-    Command(frame, kCancel);
-  });
-  ASSERT_TRUE(OpenClipboard(nullptr));
-  HGLOBAL block = GetClipboardData(CF_HDROP);
-  const auto *drop = static_cast<const DROPFILES *>(GlobalLock(block));
-  ASSERT_NE(drop, nullptr);
-  EXPECT_EQ(drop->pFiles, 20u);
-  EXPECT_FALSE(drop->fWide);
-  EXPECT_EQ(*(reinterpret_cast<const char *>(drop) + drop->pFiles), '\0') << "no file in the list";
-  GlobalUnlock(block);
-  CloseClipboard();
+  EXPECT_EQ(shown, (std::vector<bool>{false, true, false, false, false})) << "the toggle is the top tool bar's";
 }
 
 TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheLabel) {
@@ -287,7 +214,7 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
     if (c.settings) target.File("datains.ini", c.settings);
     m_state.Write(StateFile(0, 0, 0, folder));
     SetCurrentDirectoryA(folder.c_str());
-    PutFileListOnClipboard(drawing);
+    PutFileOnClipboard(drawing);
     std::string label, title;
     Browse(BrowseArgs(L""), [&](HWND frame) {
       SendMessageA(frame, WM_COMMAND, kEditPaste, 0);

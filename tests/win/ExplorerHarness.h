@@ -6,6 +6,8 @@
 
 #include <windows.h>
 #include <commctrl.h>
+#include <ole2.h>
+#include <shlobj.h>
 
 #include <fstream>
 #include <functional>
@@ -103,6 +105,7 @@ inline std::vector<int> ToolBarIds(HWND bar) {
 // One browse call: the watcher runs on its own thread while the call's modal loop runs here.
 struct BrowseOutcome {
   int resultKind = 0;
+  std::vector<int> kinds;           // the type of every node of the result, in order
   std::vector<std::wstring> texts;  // every string of the result, in order
   bool watcherFoundFrame = false;
 };
@@ -118,8 +121,10 @@ inline BrowseOutcome Browse(resbuf *args, const std::function<void(HWND frame)> 
   watch.join();
   outcome.resultKind = devhostResultKind();
   resbuf *result = devhostResultCopy();
-  for (resbuf *node = result; node; node = node->rbnext)
+  for (resbuf *node = result; node; node = node->rbnext) {
+    outcome.kinds.push_back(node->restype);
     if (node->restype == RTSTR) outcome.texts.emplace_back(node->resval.rstring);
+  }
   acutRelRb(result);
   devhostClearResult();
   return outcome;
@@ -127,4 +132,32 @@ inline BrowseOutcome Browse(resbuf *args, const std::function<void(HWND frame)> 
 
 inline resbuf *BrowseArgs(const wchar_t *folder, const wchar_t *accept = L"Insert", const wchar_t *cancel = L"Close") {
   return acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, folder, RTSTR, accept, RTSTR, cancel, 0);
+}
+
+#if __has_include(<gtest/gtest.h>)  // the benchmarks that share this header build without gtest
+#include <gtest/gtest.h>
+
+// Browse calls of the module loaded into the host, with OLE initialised on the host's thread as
+// the CAD application has it, and the state file as it was before the test.
+class BrowseTest : public ::testing::Test {
+ protected:
+  static void SetUpTestSuite() { OleInitialize(nullptr); }
+  static void TearDownTestSuite() { OleUninitialize(); }
+  void SetUp() override { ASSERT_EQ(m_module.LoadResult(), kDevhostLoaded); }
+  StateFileGuard m_state;
+  LoadedModule m_module;
+};
+#endif
+
+// Puts one file on the clipboard as an ANSI file list, as the shell's copy does.
+inline void PutFileOnClipboard(const std::string &path) {
+  HGLOBAL block = GlobalAlloc(GMEM_MOVEABLE | GMEM_ZEROINIT, sizeof(DROPFILES) + path.size() + 2);
+  auto *files = static_cast<DROPFILES *>(GlobalLock(block));
+  files->pFiles = sizeof(DROPFILES);
+  path.copy(reinterpret_cast<char *>(files + 1), path.size());
+  GlobalUnlock(block);
+  OpenClipboard(nullptr);
+  EmptyClipboard();
+  SetClipboardData(CF_HDROP, block);
+  CloseClipboard();
 }

@@ -1,6 +1,5 @@
 // Printing the active view through its frame (Ctrl+P and the view's print commands): the print
-// dialog, or the platform's own message when there is no printer, answered by a watcher; then
-// one page drawn by the view's OnDraw into a printer document. The printer is Wine's PostScript
+// dialog answered by a watcher, then one page drawn by the view's OnDraw into a printer document. The printer is Wine's PostScript
 // driver writing to a file, installed for this test only.
 #include "DialogAnswerer.h"
 #include "ScratchFolder.h"
@@ -11,7 +10,6 @@
 #include <winspool.h>
 
 #include <string>
-#include <vector>
 
 namespace {
 constexpr UINT kPrint = 57607;
@@ -40,23 +38,16 @@ class PrintTest : public ::testing::Test {
   void TearDown() override { frame->DestroyWindow(); }
 
   // Runs the command through the frame; the watcher presses OK in the dialog that shows and
-  // gives back its texts (empty when none showed).
-  std::wstring Command(UINT id) {
+  // gives back its caption (empty when none showed).
+  std::string Command(UINT id) {
     DialogAnswerer ok(IDOK);
     frame->SendMessage(WM_COMMAND, id);
-    const std::string caption = ok.Caption();
-    return caption.empty() ? std::wstring() : L"[" + std::wstring(caption.begin(), caption.end()) + L"] " + ok.Text();
+    return ok.Caption();
   }
 
   fw::CFrameWnd *frame = nullptr;
   DrawingView view;
 };
-
-bool AnyPrinter() {
-  DWORD needed = 0, count = 0;
-  EnumPrintersA(PRINTER_ENUM_LOCAL | PRINTER_ENUM_CONNECTIONS, nullptr, 4, nullptr, 0, &needed, &count);
-  return needed > 0;
-}
 
 // The test printer, the default printer while it exists, printing into a file.
 class TestPrinter {
@@ -102,15 +93,6 @@ std::string UnixPath(const std::string &path) {
   return result;
 }
 
-TEST_F(PrintTest, WithoutAPrinterThePlatformSaysSoAndNothingIsPrinted) {
-  if (AnyPrinter()) GTEST_SKIP() << "this machine has a printer";
-  for (UINT id : {kPrint, kPrintDirect, kPrintPreview}) {
-    const std::wstring dialog = Command(id);
-    EXPECT_NE(dialog.find(L"install a printer"), std::wstring::npos) << id << ": " << std::string(dialog.begin(), dialog.end());
-  }
-  EXPECT_EQ(view.printedPages, 0);
-}
-
 TEST_F(PrintTest, EachPrintCommandPrintsTheViewOnOnePageOfOneDocument) {
   ScratchFolder scratch("print");
   struct Row {
@@ -121,8 +103,7 @@ TEST_F(PrintTest, EachPrintCommandPrintsTheViewOnOnePageOfOneDocument) {
     const std::string output = scratch.File("page-" + std::to_string(row.id) + ".ps");
     TestPrinter printer(UnixPath(output));
     const int before = view.printedPages;
-    const std::wstring dialog = Command(row.id);
-    EXPECT_EQ(dialog.find(L"[Print]") == 0, row.dialog) << row.id << ": " << std::string(dialog.begin(), dialog.end());
+    EXPECT_EQ(Command(row.id), row.dialog ? "Print" : "") << row.id;
     EXPECT_EQ(view.printedPages, before + 1) << row.id;
     const std::string postScript = Content(output);
     EXPECT_NE(postScript.find("%%Title: C:\\Drawings"), std::string::npos) << row.id << " names the document after the frame";

@@ -6,8 +6,8 @@
 #include <gtest/gtest.h>
 
 #include <cstdio>
-#include <stdexcept>
 #include <string>
+#include <tuple>
 
 namespace {
 using fwtest::Log;
@@ -59,86 +59,12 @@ class ScrollViewTest : public ::testing::Test {
   HWND child = nullptr;
 };
 
-TEST_F(ScrollViewTest, ScrollSizesSetTheBarsThatTheContentNeeds) {
+TEST_F(ScrollViewTest, ScrollSizesSetTheBarsThatTheContentNeedsAndATallerWindowHasNone) {
   SCROLLINFO info{sizeof(info), SIF_ALL, 0, 0, 0, 0, 0};
   ASSERT_TRUE(GetScrollInfo(view, SB_VERT, &info));
-  EXPECT_EQ(0, info.nMin);
-  EXPECT_EQ(1599, info.nMax);
-  EXPECT_EQ(300u, info.nPage);
-  const LONG style = GetWindowLongA(view, GWL_STYLE);
-  EXPECT_TRUE(style & WS_VSCROLL);
-  EXPECT_FALSE(style & WS_HSCROLL);  // 380 still fits beside the vertical bar
-  EXPECT_EQ(1600, view.GetTotalSize().cy);
+  EXPECT_EQ(std::make_tuple(0, 1599, 300u), std::make_tuple(info.nMin, info.nMax, info.nPage));
+  EXPECT_FALSE(GetWindowLongA(view, GWL_STYLE) & WS_HSCROLL);  // 380 still fits beside the vertical bar
 
-}
-
-TEST_F(ScrollViewTest, ScrollToPositionMovesTheChildrenAndStaysInTheRange) {
-  view.ScrollToPosition(POINT{0, 320});
-  EXPECT_EQ(320, Position());
-  EXPECT_EQ(180, ChildTop());
-  view.Invalidate();
-  view.UpdateWindow();
-  EXPECT_EQ(-320, view.drawnOrigin.y);  // drawing happens in content coordinates
-
-  view.ScrollToPosition(POINT{0, 5000});
-  EXPECT_EQ(1300, Position());  // the last page
-  EXPECT_EQ(500 - 1300, ChildTop());
-  view.ScrollToPosition(POINT{-20, -5});
-  EXPECT_EQ(0, Position());
-  EXPECT_EQ(500, ChildTop());
-}
-
-TEST_F(ScrollViewTest, EachScrollBarStepGoesThroughOnScrollAndOnScrollBy) {
-  Scroll(SB_LINEDOWN);
-  EXPECT_EQ((Log{"OnScroll 01FF 0", "OnScrollBy 0,160"}), view.log);
-  EXPECT_EQ(160, Position());
-  EXPECT_EQ(340, ChildTop());
-
-  view.log.clear();
-  Scroll(SB_PAGEDOWN);
-  Scroll(SB_LINEUP);
-  Scroll(SB_THUMBTRACK, 960);
-  Scroll(SB_THUMBPOSITION, 100);  // the position was taken while tracking
-  EXPECT_EQ((Log{"OnScroll 03FF 0", "OnScrollBy 0,160", "OnScroll 00FF 0", "OnScrollBy 0,-160", "OnScroll 05FF 960",
-                 "OnScrollBy 0,800", "OnScroll 04FF 100", "OnScrollBy 0,0"}),
-            view.log);
-  EXPECT_EQ(960, Position());
-  EXPECT_EQ(500 - 960, ChildTop());
-
-  // The last step stops at the end of the range; past it nothing moves.
-  Scroll(SB_THUMBTRACK, 1280);
-  EXPECT_TRUE(view.OnScroll(MAKEWORD(0xFF, SB_LINEDOWN), 0, TRUE));
-  EXPECT_EQ(1300, Position());
-  EXPECT_FALSE(view.OnScroll(MAKEWORD(0xFF, SB_LINEDOWN), 0, TRUE));
-  EXPECT_EQ(500 - 1300, ChildTop());
-  Scroll(SB_TOP);
-  EXPECT_EQ(0, Position());
-  EXPECT_FALSE(view.OnScroll(MAKEWORD(0xFF, SB_LINEUP), 0, TRUE));
-  EXPECT_EQ(500, ChildTop());
-
-  // Without doScroll the step is only asked about.
-  EXPECT_TRUE(view.OnScrollBy(SIZE{0, 160}, FALSE));
-  EXPECT_EQ(0, Position());
-}
-
-TEST_F(ScrollViewTest, StepsStartFromTheScrollBarsPosition) {
-  view.ScrollToPosition(POINT{0, 1120});
-  // The bar set back to the top without moving the content, as a view with a wrapping range does.
-  SetScrollPos(view, SB_VERT, 0, TRUE);
-  Scroll(SB_LINEDOWN);
-  EXPECT_EQ(160, Position());
-  EXPECT_EQ(500 - 1120 - 160, ChildTop());
-}
-
-TEST_F(ScrollViewTest, TheWheelScrollsByLinesButNeverMoreThanAPage) {
-  view.SendMessage(WM_MOUSEWHEEL, MAKEWPARAM(0, static_cast<WORD>(-WHEEL_DELTA)), 0);
-  EXPECT_EQ((Log{"OnScrollBy 0,160"}), view.log);  // straight to OnScrollBy, not OnScroll
-  EXPECT_EQ(160, Position());
-  view.SendMessage(WM_MOUSEWHEEL, MAKEWPARAM(0, static_cast<WORD>(WHEEL_DELTA)), 0);
-  EXPECT_EQ(0, Position());
-}
-
-TEST_F(ScrollViewTest, AWindowTallerThanTheContentHasNoBarAndShowsTheTop) {
   view.ScrollToPosition(POINT{0, 640});
   view.MoveWindow(RECT{0, 0, 400, 1700});
   EXPECT_FALSE(GetWindowLongA(view, GWL_STYLE) & WS_VSCROLL);
@@ -146,6 +72,54 @@ TEST_F(ScrollViewTest, AWindowTallerThanTheContentHasNoBarAndShowsTheTop) {
   EXPECT_EQ(500, ChildTop());
   EXPECT_FALSE(view.OnScrollBy(SIZE{0, 160}, TRUE));
   Pump();
+}
+
+TEST_F(ScrollViewTest, ScrollToPositionMovesTheChildrenAndStaysInTheRange) {
+  view.ScrollToPosition(POINT{0, 320});
+  EXPECT_EQ(180, ChildTop());
+  view.Invalidate();
+  view.UpdateWindow();
+  EXPECT_EQ(-320, view.drawnOrigin.y);  // drawing happens in content coordinates
+  view.ScrollToPosition(POINT{0, 5000});
+  EXPECT_EQ(1300, Position());  // the last page
+  EXPECT_EQ(500 - 1300, ChildTop());
+  view.ScrollToPosition(POINT{-20, -5});
+  EXPECT_EQ(500, ChildTop());
+}
+
+TEST_F(ScrollViewTest, EachScrollBarStepGoesThroughOnScrollAndOnScrollByTheWheelStraightToOnScrollBy) {
+  Scroll(SB_LINEDOWN);
+  Scroll(SB_PAGEDOWN);
+  Scroll(SB_LINEUP);
+  Scroll(SB_THUMBTRACK, 960);
+  Scroll(SB_THUMBPOSITION, 100);  // the position was taken while tracking
+  view.SendMessage(WM_MOUSEWHEEL, MAKEWPARAM(0, static_cast<WORD>(-WHEEL_DELTA)), 0);  // a line, not more than a page
+  EXPECT_EQ((Log{"OnScroll 01FF 0", "OnScrollBy 0,160", "OnScroll 03FF 0", "OnScrollBy 0,160", "OnScroll 00FF 0",
+                 "OnScrollBy 0,-160", "OnScroll 05FF 960", "OnScrollBy 0,800", "OnScroll 04FF 100", "OnScrollBy 0,0",
+                 "OnScrollBy 0,160"}),
+            view.log);
+  EXPECT_EQ(1120, Position());
+  EXPECT_EQ(500 - 1120, ChildTop());
+
+  // The last step stops at the end of the range; past it nothing moves.
+  Scroll(SB_LINEDOWN);
+  EXPECT_TRUE(view.OnScroll(MAKEWORD(0xFF, SB_LINEDOWN), 0, TRUE));
+  EXPECT_EQ(1300, Position());
+  EXPECT_FALSE(view.OnScroll(MAKEWORD(0xFF, SB_LINEDOWN), 0, TRUE));
+  Scroll(SB_TOP);
+  EXPECT_FALSE(view.OnScroll(MAKEWORD(0xFF, SB_LINEUP), 0, TRUE));
+  EXPECT_EQ(500, ChildTop());
+  // Without doScroll the step is only asked about.
+  EXPECT_TRUE(view.OnScrollBy(SIZE{0, 160}, FALSE));
+  EXPECT_EQ(0, Position());
+
+  // Steps start from the scroll bar's position: here set back to the top without moving the
+  // content, as a view with a wrapping range does.
+  view.ScrollToPosition(POINT{0, 1120});
+  SetScrollPos(view, SB_VERT, 0, TRUE);
+  Scroll(SB_LINEDOWN);
+  EXPECT_EQ(160, Position());
+  EXPECT_EQ(500 - 1120 - 160, ChildTop());
 }
 
 }  // namespace

@@ -5,9 +5,7 @@
 #include "ScratchFolder.h"
 
 #include <gtest/gtest.h>
-#include <ole2.h>
 #include <shellapi.h>
-#include <shlobj.h>
 
 #include <array>
 #include <cstdio>
@@ -110,12 +108,8 @@ void SizeView(HWND frame, int width, int height) {
 
 bool AcceptEnabled(HWND frame) { return SendMessageA(ToolBars(frame)[1], TB_ISBUTTONENABLED, 32795, 0) != 0; }
 
-class ThumbView : public ::testing::Test {
+class ThumbView : public BrowseTest {
  protected:
-  static void SetUpTestSuite() { OleInitialize(nullptr); }
-  static void TearDownTestSuite() { OleUninitialize(); }
-  void SetUp() override { ASSERT_EQ(m_module.LoadResult(), kDevhostLoaded); }
-
   // Browses the scratch folder with the given picture size; the watcher's view is width x height.
   BrowseOutcome Run(int width, int height, const std::function<void(HWND frame, HWND view)> &watcher, int pictureWidth = 0,
                     int pictureHeight = 0, bool cancel = true) {
@@ -137,8 +131,6 @@ class ThumbView : public ::testing::Test {
     for (const std::string &name : Drawings(0, count, count)) m_folder.File(name, "");
   }
 
-  StateFileGuard m_state;
-  LoadedModule m_module;
   ScratchFolder m_folder{"thumbview"};
   const int m_step = 143 + CaptionHeight();
 };
@@ -214,18 +206,6 @@ int ClipboardFileCount() {
   return count;
 }
 
-void PutOnClipboard(const std::string &path) {
-  HGLOBAL block = GlobalAlloc(GMEM_MOVEABLE | GMEM_ZEROINIT, sizeof(DROPFILES) + path.size() + 2);
-  auto *files = static_cast<DROPFILES *>(GlobalLock(block));
-  files->pFiles = sizeof(DROPFILES);
-  path.copy(reinterpret_cast<char *>(files + 1), path.size());
-  GlobalUnlock(block);
-  OpenClipboard(nullptr);
-  EmptyClipboard();
-  SetClipboardData(CF_HDROP, block);
-  CloseClipboard();
-}
-
 TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
   struct Case {
     UINT message;
@@ -264,7 +244,7 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
     SendMessageA(frame, WM_COMMAND, kMarkAll, 0);
     SendMessageA(frame, WM_COMMAND, kCopy, 0);
     copiedAll = ClipboardFileCount();
-    PutOnClipboard(other);
+    PutFileOnClipboard(other);
     std::thread answer = Answer({'P'});
     Post(frame, view, WM_RBUTTONDOWN, MK_RBUTTON, MAKELPARAM(4 * 178 + 10, 5));  // the background's &Paste
     answer.join();
@@ -278,25 +258,16 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
 
 TEST_F(ThumbView, DoubleClickAcceptsTheDrawingAsANestedList) {
   MakeDrawings(3);
-  std::vector<std::pair<int, std::wstring>> shape;
-  std::thread watch([] {
-    HWND tile = Tiles(ViewOf(WaitForFrame()))[1].hwnd;
-    PostMessageA(tile, WM_LBUTTONDOWN, MK_LBUTTON, 0);
-    PostMessageA(tile, WM_LBUTTONDBLCLK, MK_LBUTTON, 0);
-  });
-  m_state.Write("");
-  std::string path = Folder() + "\\";
-  devhostInvoke(L"Lumvex", BrowseArgs(std::wstring(path.begin(), path.end()).c_str()));
-  watch.join();
-  resbuf *result = devhostResultCopy();
-  for (resbuf *node = result; node; node = node->rbnext)
-    shape.emplace_back(node->restype, node->restype == RTSTR ? node->resval.rstring : L"");
-  acutRelRb(result);
-  devhostClearResult();
-  const std::wstring file(path.begin(), path.end());
-  const std::vector<std::pair<int, std::wstring>> expected{
-      {RTSTR, file + L"d001.dwg"}, {RTLB, L""}, {RTSTR, L""}, {RTSTR, L""}, {RTSTR, L""}, {RTLE, L""}};
-  EXPECT_EQ(shape, expected);
+  const BrowseOutcome outcome = Run(
+      4 * 178 + 20, 400,
+      [](HWND, HWND view) {
+        PostMessageA(Tiles(view)[1].hwnd, WM_LBUTTONDOWN, MK_LBUTTON, 0);
+        PostMessageA(Tiles(view)[1].hwnd, WM_LBUTTONDBLCLK, MK_LBUTTON, 0);
+      },
+      0, 0, false);
+  const std::string file = Folder() + "\\d001.dwg";
+  EXPECT_EQ(outcome.kinds, (std::vector<int>{RTSTR, RTLB, RTSTR, RTSTR, RTSTR, RTLE}));
+  EXPECT_EQ(outcome.texts, (std::vector<std::wstring>{std::wstring(file.begin(), file.end()), L"", L"", L""}));
 }
 
 TEST_F(ThumbView, SearchFindsByPrefixAndClickingTheBoxEmptiesIt) {
@@ -355,7 +326,9 @@ TEST_F(ThumbView, TheTooltipNamesSizeAndDateOfEachTile) {
         [](HWND hwnd, LPARAM found) { return reinterpret_cast<std::vector<HWND> *>(found)->push_back(hwnd), TRUE; },
         reinterpret_cast<LPARAM>(&windows));
     char buffer[256] = "";
-    HWND tile = Tiles(view)[0].hwnd;
+    const std::vector<Tile> tiles = Tiles(view);
+    ASSERT_EQ(tiles.size(), 1u);
+    HWND tile = tiles[0].hwnd;
     TTTOOLINFOA tool{sizeof tool, 0, tile, reinterpret_cast<UINT_PTR>(tile), {}, nullptr, buffer, 0, nullptr};
     for (HWND tip : windows)
       if (!*buffer) SendMessageA(tip, TTM_GETTEXTA, sizeof buffer, reinterpret_cast<LPARAM>(&tool));
