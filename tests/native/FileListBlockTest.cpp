@@ -74,7 +74,7 @@ TEST(FileListBlock, BlockIsNeverReadPastItsEnd) {
   EXPECT_FALSE(none.NextNarrow(path));
 }
 
-TEST(FileListBlock, WideListGivesWholePathsNotOneCharacterEach) {
+TEST(FileListBlock, WideListGivesWholePathsNotOneCharacterEachReadWithinTheBlock) {
   const std::u16string first = u"C:\\Pl\u00e4ne\\a.dwg", second = u"Z:\\notes.txt";
   const std::string block = Header(20, 1) + WideBytes(first) + std::string(2, '\0') + WideBytes(second) + std::string(4, '\0');
   FileListReader reader(block.data(), block.size());
@@ -82,12 +82,10 @@ TEST(FileListBlock, WideListGivesWholePathsNotOneCharacterEach) {
   std::string narrow;
   EXPECT_FALSE(reader.NextNarrow(narrow));
   EXPECT_EQ(WidePaths(block), (std::vector<std::u16string>{first, second}));
-}
 
-TEST(FileListBlock, WideListIsReadWithinTheBlock) {
   // An odd offset, a missing final NUL and a dangling half unit are all read safely.
-  const std::string block = Header(21, 1) + "#" + WideBytes(u"C:\\a") + std::string(2, '\0') + WideBytes(u"C:\\b") + "x";
-  EXPECT_EQ(WidePaths(block), (std::vector<std::u16string>{u"C:\\a", u"C:\\b"}));
+  const std::string odd = Header(21, 1) + "#" + WideBytes(u"C:\\a") + std::string(2, '\0') + WideBytes(u"C:\\b") + "x";
+  EXPECT_EQ(WidePaths(odd), (std::vector<std::u16string>{u"C:\\a", u"C:\\b"}));
   EXPECT_TRUE(WidePaths(Header(20, 1)).empty());
   EXPECT_TRUE(WidePaths(Header(0xFFFFFFF0u, 1) + WideBytes(u"C:\\a")).empty()) << "an offset past the end";
   EXPECT_TRUE(WidePaths(Header(16, 1) + WideBytes(u"C:\\a")).empty()) << "an offset into the header";

@@ -64,7 +64,7 @@ Bytes windowsMetafile(int16_t extentX, int16_t extentY) {
 
 }  // namespace
 
-TEST(PreviewMetafile, KindsAndAspect) {
+TEST(PreviewMetafile, KindsAndAspectAndClaimsBeyondTheBytesRefused) {
   const Bytes emf = enhancedMetafile(2000, 1000, 120);
   const auto enhanced = inspectMetafile(emf.data(), emf.size());
   ASSERT_TRUE(enhanced);
@@ -94,16 +94,11 @@ TEST(PreviewMetafile, KindsAndAspect) {
   EXPECT_EQ(withHeader->size, wmf.size());
   EXPECT_EQ(withHeader->aspectWidth, 300u);
   EXPECT_EQ(withHeader->aspectHeight, 100u);
-}
 
-TEST(PreviewMetafile, ClaimsBeyondTheBytesAreRefused) {
-  const Bytes emf = enhancedMetafile(2000, 1000, 120);
+  // Claims beyond the bytes are refused.
   EXPECT_FALSE(inspectMetafile(emf.data(), 119)) << "enhanced metafile cut short";
-  const Bytes wmf = windowsMetafile(640, 480);
   EXPECT_FALSE(inspectMetafile(wmf.data(), wmf.size() - 2)) << "Windows metafile cut short";
-  Bytes placeableOnly = {0xD7, 0xCD, 0xC6, 0x9A};
-  placeableOnly.resize(20, 0);
-  EXPECT_FALSE(inspectMetafile(placeableOnly.data(), placeableOnly.size()));
+  EXPECT_FALSE(inspectMetafile(placeable.data(), 20)) << "placeable header alone";
   EXPECT_FALSE(inspectMetafile(Bytes(100, 0xAB).data(), 100)) << "not a metafile";
 
   // A record claiming more than remains ends the search for the extent, nothing worse.
@@ -113,3 +108,4 @@ TEST(PreviewMetafile, ClaimsBeyondTheBytesAreRefused) {
   ASSERT_TRUE(layout);
   EXPECT_EQ(layout->aspectWidth, 0u);
 }
+

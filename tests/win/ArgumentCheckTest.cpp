@@ -44,24 +44,19 @@ class ArgumentCheck : public ::testing::Test {
   int m_resultKind = 0;
 };
 
-TEST_F(ArgumentCheck, NoArgumentsAtAll) {
-  EXPECT_EQ(Call(nullptr), (std::vector<HostEvent>{Printed(kMissing), Alerted(kMissing)}));
-  EXPECT_EQ(devhostResultKind(), RTNONE);
-}
-
-TEST_F(ArgumentCheck, FirstArgumentNotAShort) {
-  EXPECT_EQ(Call(acutBuildList(RTSTR, L"0", RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", 0)),
-            (std::vector<HostEvent>{Printed(kWrongType), Alerted(kWrongType), Released(5)}));
-  EXPECT_EQ(Call(acutBuildList(RTLONG, 70000, 0)),
-            (std::vector<HostEvent>{Printed(kWrongType), Alerted(kWrongType), Released(1)}));
-  EXPECT_EQ(devhostResultKind(), RTNONE);
-}
-
-TEST_F(ArgumentCheck, MissingSecondToFifthArgument) {
-  EXPECT_EQ(Call(acutBuildList(RTSHORT, 0, 0)), (std::vector<HostEvent>{Printed(kMissing), Alerted(kMissing), Released(1)}));
-  EXPECT_EQ(Call(acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"", RTSTR, L"", 0)),
-            (std::vector<HostEvent>{Printed(kMissing), Alerted(kMissing), Released(4)}));
-  EXPECT_EQ(devhostResultKind(), RTNONE);
+// Missing arguments print, then alert, then release; a first argument of the wrong type too.
+TEST_F(ArgumentCheck, MissingArgumentsOrAFirstArgumentNotAShort) {
+  const std::pair<resbuf *, std::vector<HostEvent>> rows[] = {
+      {nullptr, {Printed(kMissing), Alerted(kMissing)}},
+      {acutBuildList(RTSTR, L"0", RTSHORT, 0, RTSTR, L"", RTSTR, L"", RTSTR, L"", 0),
+       {Printed(kWrongType), Alerted(kWrongType), Released(5)}},
+      {acutBuildList(RTLONG, 70000, 0), {Printed(kWrongType), Alerted(kWrongType), Released(1)}},
+      {acutBuildList(RTSHORT, 0, 0), {Printed(kMissing), Alerted(kMissing), Released(1)}},
+      {acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, L"", RTSTR, L"", 0), {Printed(kMissing), Alerted(kMissing), Released(4)}}};
+  for (const auto &[args, events] : rows) {
+    EXPECT_EQ(Call(args), events);
+    EXPECT_EQ(devhostResultKind(), RTNONE);
+  }
 }
 
 TEST_F(ArgumentCheck, WrongTypeAtAnyLaterPositionReleasesFirstThenAlertsThenPrints) {

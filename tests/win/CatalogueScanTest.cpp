@@ -80,10 +80,10 @@ TEST_F(CatalogueScan, TakesDrawingsInListingOrderWithTheirTimeAndSizeUnmarked) {
     for (int i = 0; i < g_pCatalogue->GetSize(); ++i) {
       DwgData &record = (*g_pCatalogue)[i];
       EXPECT_FALSE(record.IsSelected()) << "scan " << scan;
-      if (record.m_strDwgName == "small.dwg")
-        EXPECT_EQ(std::make_pair(record.m_tLastWrite, record.m_nFileSize), std::make_pair(946684800LL, 12u));
-      if (record.m_strDwgName == "large.dwg")
-        EXPECT_EQ(std::make_pair(record.m_tLastWrite, record.m_nFileSize), std::make_pair(4102444800LL, 70000u));
+      const auto expected = record.m_strDwgName == "small.dwg"   ? std::make_pair(946684800LL, 12u)
+                            : record.m_strDwgName == "large.dwg" ? std::make_pair(4102444800LL, 70000u)
+                                                                 : std::make_pair(record.m_tLastWrite, record.m_nFileSize);
+      EXPECT_EQ(std::make_pair(record.m_tLastWrite, record.m_nFileSize), expected) << record.m_strDwgName;
       record.Select();  // a second scan gives them unmarked
     }
   }
@@ -111,29 +111,8 @@ int Sign(int value) { return (value > 0) - (value < 0); }
 TEST(CompareNoCase, AgreesWithTheRunTime) {
   // ASCII takes a quicker path than the run time's comparison: both must order alike, also for
   // the signs between "Z" and "a" and for bytes past ASCII.
-  const char *texts[] = {"",
-                         "a",
-                         "A",
-                         "b",
-                         "_",
-                         "[",
-                         "^",
-                         "`",
-                         "{",
-                         "~",
-                         "plan",
-                         "PLAN",
-                         "plan-a",
-                         "plan.dwg",
-                         "plan2",
-                         "Z",
-                         "z",
-                         "\xC4",
-                         "\xE4",
-                         "a\xC4",
-                         "a\xE4"
-                         "b",
-                         "\xFF"};
+  const char *texts[] = {"",     "a",      "A",        "b",     "_", "[", "^",      "`",       "{",        "~",    "plan",
+                         "PLAN", "plan-a", "plan.dwg", "plan2", "Z", "z", "\xC4", "\xE4", "a\xC4", "a\xE4" "b", "\xFF"};
   for (const char *a : texts)
     for (const char *b : texts)
       EXPECT_EQ(Sign(CompareNoCase(a, b)),

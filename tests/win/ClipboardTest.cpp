@@ -167,25 +167,22 @@ TEST(ClipboardCopy, CopiedDrawingsPasteIntoAnotherFolder) {
   EXPECT_EQ(Content(source.File("a.dwg")), "alpha");
 }
 
-TEST(ClipboardPaste, ListOfOnlyNotesIsNotOfferedButStillPastes) {
-  ScratchFolder source("notes-source"), target("notes-target");
-  PutOnClipboard(CF_HDROP, NarrowList({source.File("notes.txt", "notes")}));
-  CurrentDirectory here(target.Path());
-  ForFileCommands commands;
-  EXPECT_FALSE(commands.CanPaste());
-  EXPECT_TRUE(commands.Paste());
-  EXPECT_EQ(Content(target.File("notes.txt")), "notes");
-}
-
-TEST(ClipboardPaste, DrawingInAnyCaseOffersPasteOfEveryFile) {
-  ScratchFolder source("mixed-source"), target("mixed-target");
-  PutOnClipboard(CF_HDROP, NarrowList({source.File("x.DWG", "x"), source.File("notes.txt", "notes")}));
-  CurrentDirectory here(target.Path());
-  ForFileCommands commands;
-  EXPECT_TRUE(commands.CanPaste());
-  EXPECT_TRUE(commands.Paste());
-  EXPECT_EQ(Content(target.File("x.DWG")), "x");
-  EXPECT_EQ(Content(target.File("notes.txt")), "notes");
+// Paste is offered when a drawing in any case is listed, and pastes every file listed.
+TEST(ClipboardPaste, OfferedForADrawingInAnyCaseEveryFilePastes) {
+  for (const bool withDrawing : {false, true}) {
+    ScratchFolder source("notes-source"), target("notes-target");
+    std::vector<std::string> listed{source.File("notes.txt", "notes")};
+    if (withDrawing) listed.push_back(source.File("x.DWG", "x"));
+    PutOnClipboard(CF_HDROP, NarrowList(listed));
+    CurrentDirectory here(target.Path());
+    ForFileCommands commands;
+    EXPECT_EQ(commands.CanPaste(), withDrawing);
+    EXPECT_TRUE(commands.Paste());
+    EXPECT_EQ(Content(target.File("notes.txt")), "notes");
+    if (withDrawing) {
+      EXPECT_EQ(Content(target.File("x.DWG")), "x");
+    }
+  }
 }
 
 TEST(ClipboardPaste, WideListFromTheShellIsReadAsAnsiPaths) {

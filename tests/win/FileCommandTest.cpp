@@ -85,23 +85,19 @@ TEST(FileCommandDelete, NothingMarkedDeletesNothingAndAsksNothing) {
   EXPECT_TRUE(fs::exists(folder.File("a.dwg")));
 }
 
-TEST(FileCommandRename, RenameToAFreeName) {
+TEST(FileCommandRename, ToAFreeNameMovesTheFileOntoATakenNameIsRefusedAndLosesNothing) {
   ScratchFolder folder("filecmd");
   const std::string from = folder.File("plan.dwg", "plan");
+  const std::string taken = folder.File("site.dwg", "site");
+  DialogAnswerer yes(kYes);
+  EXPECT_NE(ForFileCommands().RenameFile(from.c_str(), taken.c_str(), nullptr), 0);
+  EXPECT_EQ(yes.Caption(), "");
+  EXPECT_EQ(Content(from), "plan");
+  EXPECT_EQ(Content(taken), "site");
+
   const std::string to = folder.File("plan2.dwg");
   EXPECT_EQ(ForFileCommands().RenameFile(from.c_str(), to.c_str(), nullptr), 0);
   EXPECT_FALSE(fs::exists(from));
   EXPECT_EQ(Content(to), "plan");
-}
-
-TEST(FileCommandRename, RenameOntoATakenNameIsRefusedAndLosesNothing) {
-  ScratchFolder folder("filecmd");
-  const std::string from = folder.File("plan.dwg", "plan");
-  const std::string to = folder.File("site.dwg", "site");
-  DialogAnswerer yes(kYes);
-  EXPECT_NE(ForFileCommands().RenameFile(from.c_str(), to.c_str(), nullptr), 0);
-  EXPECT_EQ(yes.Caption(), "");
-  EXPECT_EQ(Content(from), "plan");
-  EXPECT_EQ(Content(to), "site");
 }
 }  // namespace

@@ -10,6 +10,7 @@
 
 #include <gtest/gtest.h>
 
+#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -17,36 +18,13 @@ using previewtest::Bytes;
 
 namespace {
 
-constexpr COLORREF kBackground = RGB(255, 0, 255);  // in no picture of these tests
-constexpr uint32_t kBackgroundPixel = 0xFF00FF;     // the same colour as read from a 32-bit DIB
+constexpr uint32_t kBackground = 0xFF00FF;  // in no picture of these tests; the same in RGB() and in a DIB
 
-std::wstring folderOf(const std::wstring &path) { return path.substr(0, path.find_last_of(L"\\/")); }
-
-bool exists(const std::wstring &path) { return GetFileAttributesW(path.c_str()) != INVALID_FILE_ATTRIBUTES; }
-
-// The fixtures lie beside the repository: walk up from this program to the folder holding
-// CMakePresets.json, then to ../shared/fixtures/dwg.
-std::wstring fixtureFolder() {
-  wchar_t self[MAX_PATH];
-  GetModuleFileNameW(nullptr, self, MAX_PATH);
-  for (std::wstring folder = folderOf(self); folder.size() > 3; folder = folderOf(folder))
-    if (exists(folder + L"\\CMakePresets.json")) return folder + L"\\..\\shared\\fixtures\\dwg";
-  return L"";
+std::wstring Write(const ScratchFolder &folder, const std::string &name, const Bytes &bytes) {
+  std::ofstream(folder.File(name).c_str(), std::ios::binary)
+      .write(reinterpret_cast<const char *>(bytes.data()), std::streamsize(bytes.size()));
+  return std::filesystem::path(folder.File(name)).wstring();
 }
-
-std::wstring Wide(const std::string &ascii) { return std::wstring(ascii.begin(), ascii.end()); }
-
-// Drawings written into a folder of their own.
-class TempFolder : public ScratchFolder {
- public:
-  TempFolder() : ScratchFolder("preview") {}
-  std::wstring write(const std::string &name, const Bytes &bytes) const {
-    std::ofstream(File(name).c_str(), std::ios::binary)
-        .write(reinterpret_cast<const char *>(bytes.data()), std::streamsize(bytes.size()));
-    return Wide(File(name));
-  }
-  std::wstring path() const { return Wide(Path()); }
-};
 
 // A top-most window whose WM_PAINT asks the host for a preview, as a tile does.
 class PreviewWindow {
@@ -55,7 +33,6 @@ class PreviewWindow {
     static const ATOM windowClass = [] {
       WNDCLASSW wc = {};
       wc.lpfnWndProc = &PreviewWindow::procedure;
-      wc.hInstance = GetModuleHandleW(nullptr);
       wc.lpszClassName = L"LumvexPreviewTest";
       return RegisterClassW(&wc);  // no background brush: only the painter paints
     }();
@@ -82,7 +59,11 @@ class PreviewWindow {
   // The window as 0x00RRGGBB pixels, top row first.
   std::vector<uint32_t> pixels() const {
     BITMAPINFO info = {};
-    info.bmiHeader = {sizeof info.bmiHeader, m_width, -m_height, 1, 32};
+    info.bmiHeader.biSize = sizeof info.bmiHeader;
+    info.bmiHeader.biWidth = m_width;
+    info.bmiHeader.biHeight = -m_height;
+    info.bmiHeader.biPlanes = 1;
+    info.bmiHeader.biBitCount = 32;
     void *bits = nullptr;
     const HDC windowDc = GetDC(m_window), memoryDc = CreateCompatibleDC(windowDc);
     const HBITMAP section = CreateDIBSection(windowDc, &info, DIB_RGB_COLORS, &bits, nullptr, 0);
@@ -97,8 +78,7 @@ class PreviewWindow {
     ReleaseDC(m_window, windowDc);
     return result;
   }
-  int width() const { return m_width; }
-  int height() const { return m_height; }
+  const int m_width, m_height;
 
  private:
   static LRESULT CALLBACK procedure(HWND window, UINT message, WPARAM wParam, LPARAM lParam) {
@@ -106,8 +86,7 @@ class PreviewWindow {
     if (message == WM_PAINT && self) {
       PAINTSTRUCT paint;
       BeginPaint(window, &paint);
-      const uint32_t background = kBackground;
-      self->m_result = acdbDisplayPreviewFromDwg(self->m_path.c_str(), window, &background);
+      self->m_result = acdbDisplayPreviewFromDwg(self->m_path.c_str(), window, &kBackground);
       self->m_painted = true;
       EndPaint(window, &paint);
       return 0;
@@ -115,7 +94,6 @@ class PreviewWindow {
     return message == WM_ERASEBKGND ? 1 : DefWindowProcW(window, message, wParam, lParam);
   }
 
-  int m_width, m_height;
   HWND m_window = nullptr;
   std::wstring m_path;
   bool m_painted = false, m_result = false;
@@ -125,144 +103,107 @@ struct Box {
   int left, top, right, bottom;
 };
 
-// Where a width x height picture should land in the window, worked out independently of the painter.
-Box expectedPlace(int pictureWidth, int pictureHeight, int windowWidth, int windowHeight) {
-  const double scale = std::min(double(windowWidth) / pictureWidth, double(windowHeight) / pictureHeight);
-  const int w = int(pictureWidth * scale + 0.5), h = int(pictureHeight * scale + 0.5);
-  const int left = (windowWidth - w) / 2, top = (windowHeight - h) / 2;
-  return {left, top, left + w, top + h};
-}
-
-struct PixelCount {
-  size_t background = 0;
-  size_t other = 0;
-};
-
-PixelCount countPixels(const std::vector<uint32_t> &pixels, int width, const Box &box) {
-  PixelCount count;
+// Pixels of the box that are not the background, and those that are.
+std::pair<size_t, size_t> countPixels(const std::vector<uint32_t> &pixels, int width, const Box &box) {
+  std::pair<size_t, size_t> count;
   for (int y = box.top; y < box.bottom; ++y)
-    for (int x = box.left; x < box.right; ++x)
-      ++(pixels[size_t(y) * width + x] == kBackgroundPixel ? count.background : count.other);
+    for (int x = box.left; x < box.right; ++x) ++(pixels[size_t(y) * width + x] == kBackground ? count.second : count.first);
   return count;
 }
 
-// The picture fills its place and the margins around it show the background alone. Two pixels
-// at each edge are left out: the halftone stretch blends them.
+// The picture, scaled to fit and centred (worked out here independently of the painter), fills
+// its place and the margins show the background alone. Two pixels at each edge are left out:
+// the halftone stretch blends them. A picture of no size: the background alone.
 void expectLetterbox(PreviewWindow &window, int pictureWidth, int pictureHeight) {
-  const int w = window.width(), h = window.height();
-  const Box place = expectedPlace(pictureWidth, pictureHeight, w, h);
+  const int w = window.m_width, h = window.m_height;
   const auto pixels = window.pixels();
-  const Box inside = {place.left + 2, place.top + 2, place.right - 2, place.bottom - 2};
-  const PixelCount picture = countPixels(pixels, w, inside);
-  EXPECT_GT(picture.other, 0u);
-  EXPECT_LE(picture.background * 100, picture.other) << "the picture is not where it should be";
+  if (pictureWidth == 0) {
+    EXPECT_EQ(countPixels(pixels, w, {0, 0, w, h}).first, 0u);
+    return;
+  }
+  const double scale = std::min(double(w) / pictureWidth, double(h) / pictureHeight);
+  const int pw = int(pictureWidth * scale + 0.5), ph = int(pictureHeight * scale + 0.5);
+  const Box place = {(w - pw) / 2, (h - ph) / 2, (w - pw) / 2 + pw, (h - ph) / 2 + ph};
+  const auto picture = countPixels(pixels, w, {place.left + 2, place.top + 2, place.right - 2, place.bottom - 2});
+  EXPECT_GT(picture.first, 0u);
+  EXPECT_LE(picture.second * 100, picture.first) << "the picture is not where it should be";
   for (const Box &margin :
        {Box{0, 0, w, place.top - 2}, Box{0, place.bottom + 2, w, h}, Box{0, 0, place.left - 2, h}, Box{place.right + 2, 0, w, h}})
-    EXPECT_EQ(countPixels(pixels, w, margin).other, 0u)
+    EXPECT_EQ(countPixels(pixels, w, margin).first, 0u)
         << "margin " << margin.left << "," << margin.top << "-" << margin.right << "," << margin.bottom;
 }
 
-void expectBackgroundOnly(PreviewWindow &window) {
-  const auto pixels = window.pixels();
-  const PixelCount all = countPixels(pixels, window.width(), {0, 0, window.width(), window.height()});
-  EXPECT_EQ(all.other, 0u);
-  EXPECT_GT(all.background, 0u);
+Bytes lineArt(bool png, int width, int height) {
+  const auto art = [=](int x, int y) { return previewtest::lineArt(x, y, width, height); };
+  return png ? previewtest::buildPng(width, height, art) : previewtest::buildDib24(width, height, art);
 }
 
-uint32_t pixelAt(PreviewWindow &window, int x, int y) { return window.pixels()[size_t(y) * window.width() + x]; }
-
-Bytes lineArtPng(int width, int height) {
-  return previewtest::buildPng(width, height, [=](int x, int y) { return previewtest::lineArt(x, y, width, height); });
+Bytes solid(bool png, uint32_t colour) {
+  const auto fill = [=](int, int) { return colour; };
+  return png ? previewtest::buildPng(32, 20, fill) : previewtest::buildDib24(32, 20, fill);
 }
-
-Bytes lineArtDib(int width, int height) {
-  return previewtest::buildDib24(width, height, [=](int x, int y) { return previewtest::lineArt(x, y, width, height); });
-}
-
-Bytes solidPng(uint32_t colour) {
-  return previewtest::buildPng(32, 20, [=](int, int) { return colour; });
-}
-
-Bytes solidDib(uint32_t colour) {
-  return previewtest::buildDib24(32, 20, [=](int, int) { return colour; });
-}
-
-struct FixturePicture {
-  const wchar_t *file;
-  int width, height;  // 0: the drawing shows no picture
-};
-
-const FixturePicture kFixtures[] = {
-    {L"r14-example.dwg", 216, 140},       {L"r2000-arc.dwg", 256, 102},     {L"r2004-hatch.dwg", 184, 113},
-    {L"r2007-two-bitmaps.dwg", 256, 160}, {L"r2010-line.dwg", 256, 102},    {L"r2013-arc-png.dwg", 256, 102},
-    {L"r2013-leader-png.dwg", 591, 448},  {L"r2018-header-only.dwg", 0, 0}, {L"r2018-no-images.dwg", 0, 0},
-    {L"r11-no-preview.dwg", 0, 0},
-};
 
 }  // namespace
 
 TEST(PreviewPainter, EveryFixtureInWideAndTallWindows) {
-  const std::wstring folder = fixtureFolder();
-  if (folder.empty() || !exists(folder)) GTEST_SKIP() << "no fixtures beside the repository";
+  const std::filesystem::path folder = std::filesystem::path(L"Z:" LUMVEX_FIXTURES_DIR) / "dwg";
+  if (!std::filesystem::is_directory(folder)) GTEST_SKIP() << "no fixtures beside the repository";
+  const struct {
+    const char *file;
+    int width, height;  // 0: the drawing shows no picture
+  } fixtures[] = {
+      {"r14-example.dwg", 216, 140},       {"r2000-arc.dwg", 256, 102},     {"r2004-hatch.dwg", 184, 113},
+      {"r2007-two-bitmaps.dwg", 256, 160}, {"r2010-line.dwg", 256, 102},    {"r2013-arc-png.dwg", 256, 102},
+      {"r2013-leader-png.dwg", 591, 448},  {"r2018-header-only.dwg", 0, 0}, {"r2018-no-images.dwg", 0, 0},
+      {"r11-no-preview.dwg", 0, 0},
+  };
   PreviewWindow wide(360, 160), tall(150, 260);
-  for (const FixturePicture &fixture : kFixtures) {
-    SCOPED_TRACE(std::string(fixture.file, fixture.file + wcslen(fixture.file)));
-    const std::wstring path = folder + L"\\" + fixture.file;
-    ASSERT_TRUE(exists(path));
+  for (const auto &fixture : fixtures) {
+    SCOPED_TRACE(fixture.file);
+    ASSERT_TRUE(std::filesystem::exists(folder / fixture.file));
     for (PreviewWindow *window : {&wide, &tall}) {
-      const bool painted = window->show(path);
-      if (fixture.width == 0) {
-        EXPECT_FALSE(painted);
-        expectBackgroundOnly(*window);
-      } else {
-        EXPECT_TRUE(painted);
-        expectLetterbox(*window, fixture.width, fixture.height);
-      }
+      EXPECT_EQ(window->show((folder / fixture.file).wstring()), fixture.width != 0);
+      expectLetterbox(*window, fixture.width, fixture.height);
     }
   }
 }
 
 TEST(PreviewPainter, APictureThatDoesNotDecodeGivesWayToTheNext) {
-  TempFolder temp;
+  ScratchFolder temp("preview");
   PreviewWindow window(100, 100);
   const auto colourShown = [&](const char *name, const std::vector<previewtest::Entry> &entries) {
-    EXPECT_TRUE(window.show(temp.write(name, previewtest::buildDrawing(entries))));
-    return pixelAt(window, 50, 50);
+    EXPECT_TRUE(window.show(Write(temp, name, previewtest::buildDrawing(entries))));
+    return window.pixels()[50 * 100 + 50];
   };
   const uint32_t red = 0xFF0000, green = 0x00FF00;
-  Bytes brokenPng = solidPng(red);
+  Bytes brokenPng = solid(true, red);
   brokenPng.resize(brokenPng.size() / 2);
-  EXPECT_EQ(colourShown("a.dwg", {previewtest::headerData(), {2, solidDib(green)}, {6, solidPng(red)}}), red) << "PNG first";
-  EXPECT_EQ(colourShown("c.dwg", {previewtest::headerData(), {6, brokenPng}, {2, solidDib(green)}}), green);
+  EXPECT_EQ(colourShown("a.dwg", {previewtest::headerData(), {2, solid(false, green)}, {6, solid(true, red)}}), red)
+      << "PNG first";
+  EXPECT_EQ(colourShown("c.dwg", {previewtest::headerData(), {6, brokenPng}, {2, solid(false, green)}}), green);
 }
 
 TEST(PreviewPainter, HostileOrMissingDrawingsLeaveTheBackground) {
-  TempFolder temp;
+  ScratchFolder temp("preview");
   PreviewWindow window(200, 150);
-  Bytes pastEnd = previewtest::buildDrawing({previewtest::headerData(), {2, lineArtDib(40, 30)}});
+  Bytes pastEnd = previewtest::buildDrawing({previewtest::headerData(), {2, lineArt(false, 40, 30)}});
   previewtest::set32(pastEnd, previewtest::kDirectoryAddress + 21 + 9 + 5, 0x7FFFFFFF);
-  Bytes pngBomb = lineArtPng(40, 30);
+  Bytes pngBomb = lineArt(true, 40, 30);
   previewtest::set32(pngBomb, 16, 0x00A00000);  // width 40960 and a bad checksum
-  const std::vector<std::pair<const char *, Bytes>> files = {
-      {"past-end.dwg", pastEnd},
-      {"bomb.dwg", previewtest::buildDrawing({{6, pngBomb}})},
-      {"empty.dwg", Bytes()},
-  };
-  for (const auto &file : files) {
-    SCOPED_TRACE(file.first);
-    EXPECT_FALSE(window.show(temp.write(file.first, file.second)));
-    expectBackgroundOnly(window);
+  for (const std::wstring &path : {Write(temp, "past-end.dwg", pastEnd),
+                                   Write(temp, "bomb.dwg", previewtest::buildDrawing({{6, pngBomb}})),
+                                   Write(temp, "empty.dwg", Bytes()), std::filesystem::path(temp.File("missing.dwg")).wstring()}) {
+    EXPECT_FALSE(window.show(path));
+    expectLetterbox(window, 0, 0);
   }
-  EXPECT_FALSE(window.show(temp.path() + L"\\missing.dwg"));
-  expectBackgroundOnly(window);
   EXPECT_FALSE(acdbDisplayPreviewFromDwg(L"missing.dwg", nullptr, nullptr));
 }
 
 TEST(PreviewPainter, RepaintsComeFromTheCacheUntilTheFileChanges) {
-  TempFolder temp;
+  ScratchFolder temp("preview");
   PreviewWindow window(200, 150), other(120, 120);
-  const std::wstring picture = temp.write("Cached.DWG", previewtest::buildDrawing({{6, lineArtPng(64, 40)}}));
-  const std::wstring none = temp.write("none.dwg", previewtest::buildDrawing({previewtest::headerData()}));
+  const std::wstring picture = Write(temp, "Cached.DWG", previewtest::buildDrawing({{6, lineArt(true, 64, 40)}}));
+  const std::wstring none = Write(temp, "none.dwg", previewtest::buildDrawing({previewtest::headerData()}));
   devhostPreviewClearCache();
 
   const unsigned long start = devhostPreviewDecodeCount();
@@ -280,7 +221,7 @@ TEST(PreviewPainter, RepaintsComeFromTheCacheUntilTheFileChanges) {
   // The tile passes a name relative to the scanned folder, which is the current directory.
   wchar_t previous[MAX_PATH];
   GetCurrentDirectoryW(MAX_PATH, previous);
-  SetCurrentDirectoryW(temp.path().c_str());
+  SetCurrentDirectoryA(temp.Path().c_str());
   EXPECT_TRUE(window.show(L"cached.dwg"));
   SetCurrentDirectoryW(previous);
   EXPECT_EQ(devhostPreviewDecodeCount(), start + 2);
