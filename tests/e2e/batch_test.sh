@@ -2,14 +2,7 @@
 # devhost.exe --batch driven as a script would drive it: exact standard output, alerts on
 # standard error, exit codes, and the same behaviour through ./lumvex devhost.
 # Usage: batch_test.sh BIN_DIR REPO_ROOT
-set -uo pipefail
-bin=$1
-root=$2
-run="$root/cmake/wine-run"
-passed=0
-failed=0
-work=$(mktemp -d)
-trap 'rm -rf "$work"' EXIT
+source "$(dirname "$0")/common.sh" "$@"
 
 # Presses Escape in every explorer frame that opens until the process PID ends, as a person
 # cancelling each browse would.
@@ -33,14 +26,6 @@ host() {
 }
 alerts() { grep '^alert: ' "$work/err" || true; }
 
-check() {  # check NAME EXPECTED ACTUAL
-  if [ "$2" == "$3" ]; then
-    passed=$((passed + 1))
-  else
-    failed=$((failed + 1))
-    printf 'FAILED %s\n--- expected\n%s\n--- actual\n%s\n' "$1" "$2" "$3"
-  fi
-}
 
 # Missing arguments, a wrong type and a well-typed call inside a list: the same run is then
 # made through ./lumvex devhost.
@@ -92,5 +77,4 @@ check "./lumvex devhost: same alerts" "$direct_alerts" "$(alerts)"
 "$root/lumvex" devhost --batch --module 'C:\nothing.arx' >/dev/null 2>&1
 check "./lumvex devhost: exit code passed through" 2 "$?"
 
-echo "e2e: $passed passed, $failed failed"
-[ "$failed" -eq 0 ]
+summary batch

@@ -3,32 +3,8 @@
 # remembered drawing's name in its search box, Escape ends it with nil, the state file keeps
 # every key with the name emptied, and a screenshot shows what the person saw.
 # Usage: explorer_test.sh BIN_DIR REPO_ROOT SCREENSHOT_DIR
-set -uo pipefail
-bin=$1
-root=$2
-shots=$3
-run="$root/cmake/wine-run"
-state="$bin/Lumvex1.ini"
-passed=0
-failed=0
-work=$(mktemp -d)
-saved=""
-[ -f "$state" ] && saved="$work/saved.ini" && cp "$state" "$saved"
-cleanup() {
-  if [ -n "$saved" ]; then cp "$saved" "$state"; else rm -f "$state"; fi
-  rm -rf "$work"
-}
-trap cleanup EXIT
-mkdir -p "$shots"
+source "$(dirname "$0")/common.sh" "$@"
 
-check() {
-  if [ "$2" == "$3" ]; then
-    passed=$((passed + 1))
-  else
-    failed=$((failed + 1))
-    printf 'FAILED %s\n--- expected\n%s\n--- actual\n%s\n' "$1" "$2" "$3"
-  fi
-}
 
 printf '[CurrentPath]\r\nPath=\r\nName=plan.dwg\r\nShellPath=\r\n\r\n[Size]\r\nSplitterSize=180\r\nWindowWidth=900\r\nWindowHeight=600\r\n\r\n[View]\r\nPictureWidth=0\r\nPictureHeight=0\r\nSort=1\r\n\r\n' >"$state"
 
@@ -71,5 +47,4 @@ PictureWidth=173
 PictureHeight=143
 Sort=1" "$ini"
 
-echo "e2e explorer: $passed passed, $failed failed"
-[ "$failed" -eq 0 ]
+summary explorer

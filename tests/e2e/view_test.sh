@@ -3,31 +3,8 @@
 # search box, the wheel, a larger picture size, renaming in place and the double click that
 # accepts, checked by the frame's title, the files on disk and the printed result list.
 # Usage: view_test.sh BIN_DIR REPO_ROOT SCREENSHOT_DIR
-set -uo pipefail
-bin=$1
-root=$2
-shots=$3
-state="$bin/Lumvex1.ini"
-passed=0
-failed=0
-work=$(mktemp -d)
-saved=""
-[ -f "$state" ] && saved="$work/saved.ini" && cp "$state" "$saved"
-cleanup() {
-  if [ -n "$saved" ]; then cp "$saved" "$state"; else rm -f "$state"; fi
-  rm -rf "$work"
-}
-trap cleanup EXIT
-mkdir -p "$shots"
+source "$(dirname "$0")/common.sh" "$@"
 
-check() {
-  if [ "$2" == "$3" ]; then
-    passed=$((passed + 1))
-  else
-    failed=$((failed + 1))
-    printf 'FAILED %s\n--- expected\n%s\n--- actual\n%s\n' "$1" "$2" "$3"
-  fi
-}
 
 python3 "$root/tools/make_sample_drawings.py" "$work/drawings" 40 --seed 2 >/dev/null
 mapfile -t names < <(ls "$work/drawings" | tr 'A-Z' 'a-z' | LC_ALL=C sort)
@@ -86,5 +63,4 @@ wait "$host"
 
 check "the double click accepts" "(\"${folder//\\/\\\\}\\\\${names[0]}\" (\"\" \"\" \"\"))" "$(tr -d '\r' <"$work/out")"
 
-echo "e2e view: $passed passed, $failed failed"
-[ "$failed" -eq 0 ]
+summary view
