@@ -52,29 +52,3 @@ TEST(LispPrinter, StringEscapesForPrin1AndRawForPrinc) {
   EXPECT_EQ(lisp::Princ(Value::Str(raw)), raw);
   EXPECT_EQ(lisp::Princ(Value::List({Value::Str(L"a b"), Value::Str(L"\"")})), L"(a b \")");
 }
-
-TEST(LispPrinter, ReadingWhatPrin1WroteGivesTheValueBack) {
-  std::wstring everyCharacter;
-  for (wchar_t c = 0; c < 300; ++c) everyCharacter += c;
-  const std::vector<Value> values = {
-      Value::Nil(),
-      Value::True(),
-      Value::Int(0),
-      Value::Int(INT32_MAX),
-      Value::Int(INT32_MIN),
-      Value::Real(2.5),
-      Value::Real(-2.0),
-      Value::Real(1e6),
-      Value::Real(1.5e-7),
-      Value::Str(everyCharacter),
-      Value::Str(L"\\0015 \\n"),
-      Value::Sym(L"C:MYCMD"),
-      Value::Sym(L"1+"),
-      Value::List({Value::Str(L"c:\\a\\b.dwg"), Value::List({Value::Str(L"WALLS"), Value::Str(L"1"), Value::Str(L"MYCMD")})}),
-      Value::List({Value::Sym(L"QUOTE"), Value::List({Value::Nil(), Value::Int(-1)})}),
-  };
-  for (const Value &value : values) {
-    const std::wstring text = lisp::Prin1(value);
-    EXPECT_EQ(lisp::ReadAll(text), std::vector<Value>{value}) << std::string(text.begin(), text.end());
-  }
-}

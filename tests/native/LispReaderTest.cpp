@@ -77,22 +77,6 @@ TEST(LispReader, ListsQuotesAndComments) {
   EXPECT_TRUE(lisp::ReadAll(L";| never closed").empty());
 }
 
-TEST(LispReader, DottedTailsThatAreListsJoinTheListOtherwiseMessages) {
-  EXPECT_EQ(ReadOne(L"(a . (b c))"), Value::List({Sym(L"A"), Sym(L"B"), Sym(L"C")}));
-  EXPECT_EQ(ReadOne(L"(a . nil)"), Value::List({Sym(L"A")}));
-  const char *const dot = "misplaced dot on input", *const list = "malformed list on input";
-  const std::pair<const wchar_t *, const char *> rows[] = {{L"(a . b)", "dotted pairs are not supported on input"},
-                                                           {L"(. a)", dot},
-                                                           {L".", dot},
-                                                           {L"(1 2", list},
-                                                           {L"(princ \"abc)", list},
-                                                           {L"(a ')", list},
-                                                           {L"\"abc", "malformed string on input"},
-                                                           {L"\"abc\\", "malformed string on input"},
-                                                           {L")", "extra right paren on input"}};
-  for (const auto &[source, message] : rows) EXPECT_EQ(ReadError(source), message) << source;
-}
-
 TEST(LispReader, NestingIsLimitedWithoutExhaustingTheStack) {
   const int limit = lisp::kMaxReadDepth;
   const Value deepest = ReadOne(std::wstring(limit, L'(') + L"1" + std::wstring(limit, L')'));

@@ -59,10 +59,17 @@ std::string ReadClipboardInAnotherProcess() {
   CloseHandle(writeEnd);
   std::string output;
   if (started) {
+    // The reader asks this process's clipboard windows for the data: keep them answering while
+    // it runs, then read what it printed (a few lines, well within the pipe's buffer).
+    const DWORD deadline = GetTickCount() + 10000;
+    while (MsgWaitForMultipleObjects(1, &process.hProcess, FALSE, 100, QS_ALLINPUT) != WAIT_OBJECT_0 &&
+           GetTickCount() < deadline) {
+      MSG message;
+      while (PeekMessageA(&message, nullptr, 0, 0, PM_REMOVE)) DispatchMessageA(&message);
+    }
     char buffer[512];
     DWORD got = 0;
     while (ReadFile(readEnd, buffer, sizeof buffer, &got, nullptr) && got) output.append(buffer, got);
-    WaitForSingleObject(process.hProcess, 10000);
     CloseHandle(process.hThread);
     CloseHandle(process.hProcess);
   } else {

@@ -97,34 +97,6 @@ class Reflecting : public Base {
   Log &m_log;
 };
 
-TEST(FwEditTest, MessagesPassThroughTheObjectAndNotificationsAndColourComeBackToIt) {
-  Parent parent;
-  ASSERT_TRUE(parent.Create());
-  Reflecting<fw::CEdit> edit(parent.log);
-  ASSERT_TRUE(edit.Create(WS_CHILD | WS_VISIBLE | ES_AUTOHSCROLL, RECT{10, 10, 210, 40}, &parent, 101));
-  EXPECT_EQ(static_cast<UINT>(WM_NCCREATE), edit.firstMessage);
-
-  edit.SetWindowText("plan");
-  EXPECT_EQ("plan", edit.GetWindowText());  // the edit control's own procedure did its work
-  EXPECT_EQ((Log{"control WindowProc WM_SETTEXT", "control EN_CHANGE"}), parent.log);
-
-  // A control that leaves the notification alone lets the parent's command routing see it.
-  parent.log.clear();
-  edit.takes = false;
-  edit.SetSel(4, 4);
-  edit.SendMessage(WM_CHAR, 's', 1);
-  EXPECT_EQ("plans", edit.GetWindowText());
-  EXPECT_EQ((Log{"control EN_CHANGE", "parent EN_CHANGE"}), parent.log);
-
-  edit.brush = CreateSolidBrush(RGB(0, 128, 255));
-  edit.Invalidate();
-  edit.UpdateWindow();
-  Pump();
-  EXPECT_EQ("control WM_CTLCOLOREDIT", parent.log.back());
-  edit.DestroyWindow();
-  DeleteObject(edit.brush);
-}
-
 TEST(FwTreeCtrlTest, NotificationsAreReflectedToTheTreeInTheOrderTheControlSendsThem) {
   Parent parent;
   ASSERT_TRUE(parent.Create());
@@ -177,24 +149,6 @@ TEST_F(ToolBarTest, ButtonsSeparatorsAndPicturesComeFromTheResourceAndASeparator
   EXPECT_EQ(125, slot.right - slot.left);
   EXPECT_EQ(slot.right, next.left);
   EXPECT_EQ(9, bar.CommandToIndex(32790));
-}
-
-TEST_F(ToolBarTest, ToolTipsAreTheTextAfterTheNewline) {
-  const HWND tips = bar.GetToolTips();
-  ASSERT_NE(nullptr, tips);
-  // Asked as the tool tip control asks the tool bar for a button's text.
-  const auto ask = [&](UINT id) {
-    NMTTDISPINFOW info{};
-    info.hdr.hwndFrom = tips;
-    info.hdr.idFrom = id;
-    info.hdr.code = TTN_GETDISPINFOW;
-    SendMessageW(bar, WM_NOTIFY, id, reinterpret_cast<LPARAM>(&info));
-    return std::wstring(info.lpszText ? info.lpszText : L"");
-  };
-  EXPECT_EQ(L"Scroll to begin", ask(32771));
-  EXPECT_EQ(L"Increase", ask(32774));
-  EXPECT_EQ(L"", ask(32775));  // a prompt without a tip
-  EXPECT_EQ(L"", ask(32782));  // no string at all
 }
 
 TEST_F(ToolBarTest, PointingAtButtonsShowsTheirPromptsUntilThePointerLeaves) {
