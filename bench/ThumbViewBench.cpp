@@ -144,8 +144,12 @@ void Measure(HWND frame) {
   RECT client, window;
   GetClientRect(view, &client);
   GetWindowRect(frame, &window);
+  // At the screen's top left corner, so that the screen's height does not cut the frame short.
   SetWindowPos(frame, nullptr, 0, 0, window.right - window.left + 1100 - client.right,
-               window.bottom - window.top + kVisibleRows * rowStep - client.bottom, SWP_NOMOVE | SWP_NOZORDER);
+               window.bottom - window.top + kVisibleRows * rowStep - client.bottom, SWP_NOZORDER);
+  GetClientRect(view, &client);
+  if (client.bottom / rowStep != kVisibleRows)
+    std::fprintf(stderr, "bench_thumbview: the view shows %ld rows, not %d\n", client.bottom / rowStep, kVisibleRows);
 
   // First screen after a rescan, against the bare scan and the bare cold paint of its previews.
   std::vector<double> reload, bare;
