@@ -80,7 +80,11 @@ red=0
 for i in 1 2 3; do [ "$(bar "$shots/tree-loading-$i.png")" == 1 ] && red=1; done
 check "the progress bar shows while 20,000 folders load" 1 "$red"
 for _ in $(seq 60); do [ "$(bar "$work/loaded.png")" == 0 ] && break; sleep 0.5; done
-keys "$frame" Left Down
+keys "$frame" Left
+for _ in 1 2 3; do  # a key pressed as the load ends is now and then lost under a busy X server
+  keys "$frame" Down
+  [ "$(xdotool getwindowname "$frame" 2>/dev/null)" == "$plans\\Archive" ] || break
+done
 check "the keys choose the next folder once the load is done" "$plans\\Details" "$(named "$frame" "$plans\\Details")"
 keys "$frame" Tab
 finish "first browse"

@@ -33,7 +33,7 @@ check "a click chooses a drawing" "$folder\\${names[0]}" "$(title)"
 xdotool mousemove $(tile 5) keydown ctrl click 1 keyup ctrl
 check "Ctrl+click adds one" "$folder\\${names[5]}" "$(title)"
 
-xdotool mousemove $((X + 240)) $((Y + 55)) click 1 type "${names[12]:0:6}"
+xdotool mousemove $((X + 240)) $((Y + 55)) click 1 sleep 0.3 type --delay 80 "${names[12]:0:6}"
 check "the search box finds by prefix" "$folder\\${names[12]}" "$(title)"
 
 # The search put row 3 at the top; a notch down scrolls three rows that come with their tiles.
