@@ -118,13 +118,17 @@ void Accept(DialogState &state) {
   PostMessageW(state.dialog, WM_NULL, 0, 0);  // the loop looks at `done` once a message arrives
 }
 
+// The dialog's state for its windows: handed over at creation, kept in the window's user data.
+DialogState *StateOf(HWND hwnd, UINT message, LPARAM lParam) {
+  if (message == WM_NCCREATE)
+    SetWindowLongPtrW(hwnd, GWLP_USERDATA,
+                      reinterpret_cast<LONG_PTR>(reinterpret_cast<CREATESTRUCTW *>(lParam)->lpCreateParams));
+  return reinterpret_cast<DialogState *>(GetWindowLongPtrW(hwnd, GWLP_USERDATA));
+}
+
 LRESULT CALLBACK GridProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
-  auto *state = reinterpret_cast<DialogState *>(GetWindowLongPtrW(hwnd, GWLP_USERDATA));
+  DialogState *state = StateOf(hwnd, message, lParam);
   switch (message) {
-    case WM_NCCREATE:
-      SetWindowLongPtrW(hwnd, GWLP_USERDATA,
-                        reinterpret_cast<LONG_PTR>(reinterpret_cast<CREATESTRUCTW *>(lParam)->lpCreateParams));
-      break;
     case WM_PAINT:
       if (state) PaintGrid(hwnd, *state);
       return 0;
@@ -144,12 +148,8 @@ LRESULT CALLBACK GridProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam)
 }
 
 LRESULT CALLBACK DialogProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam) {
-  auto *state = reinterpret_cast<DialogState *>(GetWindowLongPtrW(hwnd, GWLP_USERDATA));
+  DialogState *state = StateOf(hwnd, message, lParam);
   switch (message) {
-    case WM_NCCREATE:
-      SetWindowLongPtrW(hwnd, GWLP_USERDATA,
-                        reinterpret_cast<LONG_PTR>(reinterpret_cast<CREATESTRUCTW *>(lParam)->lpCreateParams));
-      break;
     case DM_GETDEFID: return MAKELONG(IDOK, DC_HASDEFID);
     case WM_COMMAND:
       if (!state) break;

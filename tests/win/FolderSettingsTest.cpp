@@ -6,7 +6,6 @@
 #include "settings/IniFile.h"
 
 #include <gtest/gtest.h>
-#include <ole2.h>
 
 #include <algorithm>
 #include <functional>
@@ -52,14 +51,7 @@ struct Case {
 const char kWallsWithOther[] =
     "[Other]\r\nKey=kept\r\n\r\n[Default Parameters]\r\nLayer=WALLS\r\nLisp command=\r\nColor=1\r\n\r\n";
 
-class FolderSettings : public ::testing::Test {
- protected:
-  static void SetUpTestSuite() { OleInitialize(nullptr); }
-  static void TearDownTestSuite() { OleUninitialize(); }
-  void SetUp() override { ASSERT_EQ(m_module.LoadResult(), kDevhostLoaded); }
-  StateFileGuard m_state;
-  LoadedModule m_module;
-};
+class FolderSettings : public BrowseTest {};
 
 TEST_F(FolderSettings, DialogRulesAndTheBrowseResult) {
   const Case cases[] = {
