@@ -31,6 +31,28 @@ check() {  # check NAME EXPECTED ACTUAL
   fi
 }
 
+window() {  # window TITLE-REGEX: the visible window, waiting for it
+  local found=""
+  for _ in $(seq 100); do
+    found=$(xdotool search --onlyvisible --name "$1" 2>/dev/null | head -n 1)
+    [ -n "$found" ] && break
+    sleep 0.1
+  done
+  # Wine may replace a window's X window while it is being shown: the settled one counts.
+  sleep 0.5
+  xdotool search --onlyvisible --name "$1" 2>/dev/null | head -n 1
+}
+
+named() {  # named WINDOW EXPECTED: the window's title once it reads EXPECTED (or after 15 s)
+  local name=""
+  for _ in $(seq 150); do
+    name=$(xdotool getwindowname "$1" 2>/dev/null)
+    [ "$name" == "$2" ] && break
+    sleep 0.1
+  done
+  echo "$name"
+}
+
 summary() {  # summary NAME: the counts, and the exit status of the script
   echo "e2e $1: $passed passed, $failed failed"
   [ "$failed" -eq 0 ]

@@ -12,18 +12,6 @@ python3 "$root/tools/make_sample_drawings.py" "$work/one" 1 >/dev/null && mv "$w
 plans="Z:${work//\//\\}\\Plans"
 
 
-window() {  # window TITLE-REGEX: the visible window, waiting for it
-  local found=""
-  for _ in $(seq 100); do
-    found=$(xdotool search --onlyvisible --name "$1" 2>/dev/null | head -n 1)
-    [ -n "$found" ] && break
-    sleep 0.1
-  done
-  # Wine may replace a window's X window while it is being shown: the settled one counts.
-  sleep 0.5
-  xdotool search --onlyvisible --name "$1" 2>/dev/null | head -n 1
-}
-
 keys() {  # keys WINDOW KEY...
   local target=$1
   shift
@@ -36,16 +24,6 @@ browse() {  # browse START-FOLDER: runs a browse call in the background
   "$run" "$bin/devhost.exe" --batch --layers "0=7;WALLS=1" --eval "(Lumvex 0 0 \"${1//\\/\\\\}\" \"Insert\" \"Close\")" \
     >"$work/out" 2>"$work/err" &
   host=$!
-}
-
-named() {  # named WINDOW EXPECTED: the window's title once it reads EXPECTED (or after 15 s)
-  local name=""
-  for _ in $(seq 150); do
-    name=$(xdotool getwindowname "$1" 2>/dev/null)
-    [ "$name" == "$2" ] && break
-    sleep 0.1
-  done
-  echo "$name"
 }
 
 ended() {  # ended: what the host printed once the browse has ended (or been ended after 5 s)

@@ -14,41 +14,37 @@ printf '[Size]\r\nSplitterSize=150\r\nWindowWidth=1000\r\nWindowHeight=700\r\n\r
 "$root/cmake/wine-run" "$bin/devhost.exe" --batch --eval "(Lumvex 0 0 \"${folder//\\/\\\\}\\\\\" \"Insert\" \"Close\")" \
   >"$work/out" 2>"$work/err" &
 host=$!
-frame=""
-for _ in $(seq 100); do
-  frame=$(xdotool search --onlyvisible --name '^Z:' 2>/dev/null | head -n 1)
-  [ -n "$frame" ] && break
-  sleep 0.2
-done
+frame=$(window '^Z:')
 check "the explorer shows the folder" "$folder" "$(xdotool getwindowname "$frame" 2>/dev/null)"
-sleep 1
 eval "$(xdotool getwindowgeometry --shell "$frame")"
 # The view starts below the tool bar, right of the folder pane; 4 columns 178 pixels apart, rows 163.
 view_x=$((X + 163)) view_y=$((Y + 74))
 tile() { echo $((view_x + 86 + 178 * ($1 % 4))) $((view_y + 70 + 163 * ($1 / 4))); }
-title() { sleep 1.5; xdotool getwindowname "$frame"; }
+shows() {  # shows NAME DRAWING: the frame's title names the drawing once the input is handled
+  check "$1" "$folder\\$2" "$(named "$frame" "$folder\\$2")"
+}
 
 xdotool mousemove $(tile 0) click 1
-check "a click chooses a drawing" "$folder\\${names[0]}" "$(title)"
+shows "a click chooses a drawing" "${names[0]}"
 xdotool mousemove $(tile 5) keydown ctrl click 1 keyup ctrl
-check "Ctrl+click adds one" "$folder\\${names[5]}" "$(title)"
+shows "Ctrl+click adds one" "${names[5]}"
 
 xdotool mousemove $((X + 240)) $((Y + 55)) click 1 sleep 0.3 type --delay 80 "${names[12]:0:6}"
-check "the search box finds by prefix" "$folder\\${names[12]}" "$(title)"
+shows "the search box finds by prefix" "${names[12]}"
 
 # The search put row 3 at the top; a notch down scrolls three rows that come with their tiles.
 xdotool mousemove $(tile 1) click 5 sleep 0.5 click 1
-check "the wheel scrolls whole rows" "$folder\\${names[$((6 * 4 + 1))]}" "$(title)"
+shows "the wheel scrolls whole rows" "${names[$((6 * 4 + 1))]}"
 xdotool key Home
 
 xdotool mousemove $((X + 51)) $((Y + 55)) click 1
 xdotool mousemove $((view_x + 400)) $((view_y + 70)) click 1
-check "larger pictures: the third column now shows the second drawing" "$folder\\${names[1]}" "$(title)"
+shows "larger pictures: the third column now shows the second drawing" "${names[1]}"
 
 # The caption under the first tile: double click, type, Enter.
 xdotool mousemove $((view_x + 60)) $((view_y + 179 + 12)) click --repeat 2 --delay 80 1 type "renamed.dwg"
 xdotool key Return
-sleep 1
+for _ in $(seq 50); do [ -e "$work/drawings/renamed.dwg" ] && break; sleep 0.2; done
 check "rename in place" "renamed.dwg" "$(ls "$work/drawings" | tr 'A-Z' 'a-z' | grep -x -e renamed.dwg -e "${names[0]}")"
 
 import -window root "$shots/view.png"
