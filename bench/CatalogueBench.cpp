@@ -1,6 +1,7 @@
 // Costs of the drawing catalogue: scanning a large folder against a bare directory listing,
 // sorting a large catalogue by each key, and the memory one record takes.
 // Prints one figure a line: name value unit.
+#include "BenchClock.h"
 #include "catalogue/DwgData.h"
 #include "catalogue/FolderScan.h"
 #include "catalogue/Ordering.h"
@@ -50,17 +51,6 @@ const char kMixedFolder[] = "Z:\\tmp\\lumvex-bench-100k";        // 100,000 entr
 const char kDrawingFolder[] = "Z:\\tmp\\lumvex-bench-100k-dwg";  // 100,000 drawings
 const int kEntries = 100000;
 const int kRounds = 3;
-
-double NowMs() {
-  static LARGE_INTEGER frequency = [] {
-    LARGE_INTEGER f;
-    QueryPerformanceFrequency(&f);
-    return f;
-  }();
-  LARGE_INTEGER now;
-  QueryPerformanceCounter(&now);
-  return 1000.0 * static_cast<double>(now.QuadPart) / static_cast<double>(frequency.QuadPart);
-}
 
 std::string DrawingName(int i, std::mt19937 &random) {
   char name[64];

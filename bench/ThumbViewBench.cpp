@@ -9,6 +9,7 @@
 //   view_tiles_max               most tile windows alive during those steps
 //   view_gdi_growth              live GDI objects after, minus before
 // Prints one figure a line: name value unit.
+#include "BenchClock.h"
 #include "ExplorerHarness.h"
 #include "catalogue/FolderScan.h"
 #include "preview/PreviewTestApi.h"
@@ -31,22 +32,6 @@ constexpr int kSteps = 200;
 constexpr UINT kRefreshFolder = WM_APP + 0x10;  // the view's own rescan-and-reload message
 constexpr int kPaneFirst = 0xE900;
 constexpr int kBrowseCancel = 32796;
-
-double NowMs() {
-  static const LARGE_INTEGER frequency = [] {
-    LARGE_INTEGER f;
-    QueryPerformanceFrequency(&f);
-    return f;
-  }();
-  LARGE_INTEGER now;
-  QueryPerformanceCounter(&now);
-  return 1000.0 * static_cast<double>(now.QuadPart) / static_cast<double>(frequency.QuadPart);
-}
-
-double Median(std::vector<double> values) {
-  std::sort(values.begin(), values.end());
-  return values.empty() ? 0.0 : values[values.size() / 2];
-}
 
 std::string Name(int record) {
   char name[32];

@@ -1,7 +1,8 @@
 // Expanding a folder of 1,000 sub-folders in the explorer's tree, from the expansion to the
 // children painted, against a bare enumeration of the same folder through the shell (names and
 // attributes of every child). Prints one figure a line: name value unit.
-#include "ExplorerHarness.h"
+#include "BenchClock.h"
+#include "TreeWatch.h"
 
 #include <ole2.h>
 #include <shlobj.h>
@@ -13,13 +14,6 @@
 namespace {
 constexpr int kFolders = 1000;
 constexpr int kRounds = 5;
-
-double NowMs() {
-  LARGE_INTEGER frequency, now;
-  QueryPerformanceFrequency(&frequency);
-  QueryPerformanceCounter(&now);
-  return 1000.0 * static_cast<double>(now.QuadPart) / static_cast<double>(frequency.QuadPart);
-}
 
 // <temp>\lumvex-tree-bench\big with its sub-folders, made once.
 std::string MakeBenchFolder() {
@@ -67,46 +61,24 @@ double BareEnumerationMs(const std::string &folder) {
   return count == kFolders ? elapsed : -1;
 }
 
-HWND FindTreeOf(HWND frame) {
-  HWND tree = nullptr;
-  EnumChildWindows(
-      frame,
-      [](HWND child, LPARAM found) {
-        char name[32] = "";
-        GetClassNameA(child, name, sizeof name);
-        if (std::string(name) != WC_TREEVIEWA) return TRUE;
-        *reinterpret_cast<HWND *>(found) = child;
-        return FALSE;
-      },
-      reinterpret_cast<LPARAM>(&tree));
-  return tree;
-}
-
 double TreeExpansionMs(const std::string &parent) {
   double elapsed = -1;
   const std::string start = parent + "\\";
   Browse(BrowseArgs(std::wstring(start.begin(), start.end()).c_str()), [&](HWND frame) {
-    HWND tree = FindTreeOf(frame);
-    auto next = [tree](HTREEITEM item, UINT code) {
-      return reinterpret_cast<HTREEITEM>(SendMessageA(tree, TVM_GETNEXTITEM, code, reinterpret_cast<LPARAM>(item)));
-    };
-    HTREEITEM big = next(next(nullptr, TVGN_CARET), TVGN_CHILD);
+    HWND tree = FindTree(frame);
+    HTREEITEM big = TreeNext(tree, TreeNext(tree, nullptr, TVGN_CARET), TVGN_CHILD);
     const double begin = NowMs();
     SendMessageA(tree, TVM_EXPAND, TVE_EXPAND, reinterpret_cast<LPARAM>(big));
     UpdateWindow(tree);
     const double end = NowMs();
     int count = 0;
-    for (HTREEITEM child = next(big, TVGN_CHILD); child; child = next(child, TVGN_NEXT)) ++count;
+    for (HTREEITEM child = TreeNext(tree, big, TVGN_CHILD); child; child = TreeNext(tree, child, TVGN_NEXT)) ++count;
     if (count == kFolders) elapsed = end - begin;
     PostMessageA(frame, WM_CLOSE, 0, 0);
   });
   return elapsed;
 }
 
-double Median(std::vector<double> values) {
-  std::sort(values.begin(), values.end());
-  return values[values.size() / 2];
-}
 }  // namespace
 
 int main() {

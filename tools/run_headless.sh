@@ -11,17 +11,7 @@ drive=$2
 shots=$3
 mkdir -p "$shots"
 bin=$(dirname "$exe")
-state="$bin/Lumvex1.ini"
-work=$(mktemp -d)
-saved=""
-[ -f "$state" ] && saved="$work/state.ini" && cp "$state" "$saved"
-host=""
-cleanup() {
-  [ -n "$host" ] && kill "$host" 2>/dev/null
-  if [ -n "$saved" ]; then cp "$saved" "$state"; else rm -f "$state"; fi
-  rm -rf "$work"
-}
-trap cleanup EXIT
+source "$(dirname "$0")/host_session.sh"
 
 # A known window size and tree width, so that the drawing and the button can be clicked.
 splitter=260

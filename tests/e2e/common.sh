@@ -7,19 +7,9 @@ bin=$1
 root=$2
 shots=${3:-}
 run="$root/cmake/wine-run"
-state="$bin/Lumvex1.ini"
 passed=0
 failed=0
-work=$(mktemp -d /tmp/lumvex-e2e.XXXXXX)
-saved=""
-[ -f "$state" ] && saved="$work.ini" && cp "$state" "$saved"
-host=""
-cleanup() {
-  [ -n "$host" ] && kill "$host" 2>/dev/null
-  if [ -n "$saved" ]; then mv "$saved" "$state"; else rm -f "$state"; fi
-  rm -rf "$work"
-}
-trap cleanup EXIT
+source "$root/tools/host_session.sh"
 [ -n "$shots" ] && mkdir -p "$shots"
 
 check() {  # check NAME EXPECTED ACTUAL
