@@ -153,7 +153,9 @@ void COmbra3View::RebuildAtTopRow() {
   DestroyTileWindows();
   const int rowStep = RowStep();
   const long long range = CappedTotalHeight(rowStep, m_nTotalRows, ClientHeight() % rowStep);
-  const int newTop = TopRowForColumns(m_nTopRow, m_nLayoutColumns, m_nColumns, m_nRecordCount);
+  int newTop = TopRowForColumns(m_nTopRow, m_nLayoutColumns, m_nColumns, m_nRecordCount);
+  // Where every row fits there is no scroll bar to reach rows above the top one: show them all.
+  if ((m_nRecordCount + m_nColumns - 1) / m_nColumns <= ClientHeight() / rowStep) newTop = 0;
   m_nLayoutColumns = m_nColumns;
   long long y = static_cast<long long>(rowStep) * newTop;
   if (range > 0 && y > range) y = (y - 1) % range + 1;  // the wrap: what subtracting the range until y <= range gives

@@ -154,6 +154,18 @@ TEST_F(ThumbView, KeysWheelAndScrollBarKeepEveryVisibleRowFilled) {
   });
 }
 
+TEST_F(ThumbView, WhenEveryRowFitsNoneIsLeftAboveTheTop) {
+  MakeDrawings(12);  // 3 rows of 4
+  Run(4 * 178 + 20, 2 * m_step, [&](HWND frame, HWND view) {
+    Post(frame, view, WM_KEYDOWN, VK_END);
+    ASSERT_EQ(Names(view), Drawings(4, 8, 12));
+    SizeView(frame, 4 * 178 + 20, 3 * m_step + 10);
+    EXPECT_EQ(Names(view), Drawings(0, 12, 12));
+    SendMessageA(SearchBox(frame), WM_SETTEXT, 0, LPARAM("d011"));
+    EXPECT_EQ(Names(view), Drawings(0, 12, 12));
+  });
+}
+
 TEST_F(ThumbView, TheScrollBarWrapsAtTheCappedRange) {
   MakeDrawings(1000);
   Run(
