@@ -3,6 +3,7 @@
 #include "catalogue/DwgData.h"
 #include "catalogue/Ombra3Doc.h"
 #include "catalogue/Ordering.h"
+#include "explorer/Handles.h"
 #include "explorer/LeftView.h"
 #include "explorer/MainFrame.h"
 #include "filecmd/ForFileCommands.h"
@@ -26,23 +27,10 @@ constexpr UINT kRefreshFolderMessage = WM_APP + 0x10;
 // Ids of the background menu.
 enum : UINT { kMenuCopy = 1, kMenuPaste = 2, kMenuDelete = 3, kMenuRename = 4 };
 
-class WindowDC {
- public:
-  explicit WindowDC(HWND hwnd) : m_hwnd(hwnd), m_dc(::GetDC(hwnd)) {}
-  ~WindowDC() { ::ReleaseDC(m_hwnd, m_dc); }
-  WindowDC(const WindowDC &) = delete;
-  WindowDC &operator=(const WindowDC &) = delete;
-  HDC get() const { return m_dc; }
-
- private:
-  HWND m_hwnd;
-  HDC m_dc;
-};
-
 int MeasureCaptionHeight() {
-  WindowDC screen(nullptr);
+  const ClientDeviceContext screen(nullptr);
   TEXTMETRICA metrics{};
-  ::GetTextMetricsA(screen.get(), &metrics);
+  ::GetTextMetricsA(screen.Get(), &metrics);
   return metrics.tmHeight + 2 + ::GetSystemMetrics(SM_CYEDGE);
 }
 
@@ -455,14 +443,14 @@ LRESULT COmbra3View::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
       const LRESULT result = CScrollView::WindowProc(message, wParam, lParam);
       RECT client;
       GetClientRect(&client);
-      ::DrawFocusRect(WindowDC(m_hWnd).get(), &client);
+      ::DrawFocusRect(ClientDeviceContext(m_hWnd).Get(), &client);
       return result;
     }
     case WM_KILLFOCUS: {
       const LRESULT result = Default();
       RECT client;
       GetClientRect(&client);
-      ::FrameRect(WindowDC(m_hWnd).get(), &client, ::GetSysColorBrush(COLOR_SCROLLBAR));
+      ::FrameRect(ClientDeviceContext(m_hWnd).Get(), &client, ::GetSysColorBrush(COLOR_SCROLLBAR));
       return result;
     }
     case WM_MOUSEWHEEL: OnMouseWheel(GET_WHEEL_DELTA_WPARAM(wParam)); return 0;

@@ -43,6 +43,13 @@ named() {  # named WINDOW EXPECTED: the window's title once it reads EXPECTED (o
   echo "$name"
 }
 
+ended() {  # ended: what the host printed once the browse has ended (or been ended after 10 s)
+  for _ in $(seq 100); do kill -0 "$host" 2>/dev/null || break; sleep 0.1; done
+  kill -0 "$host" 2>/dev/null && kill "$host"
+  wait "$host"
+  tr -d '\r' <"$work/out"
+}
+
 summary() {  # summary NAME: the counts, and the exit status of the script
   echo "e2e $1: $passed passed, $failed failed"
   [ "$failed" -eq 0 ]

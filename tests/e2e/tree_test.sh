@@ -26,13 +26,6 @@ browse() {  # browse START-FOLDER: runs a browse call in the background
   host=$!
 }
 
-ended() {  # ended: what the host printed once the browse has ended (or been ended after 5 s)
-  for _ in $(seq 50); do kill -0 "$host" 2>/dev/null || break; sleep 0.1; done
-  kill -0 "$host" 2>/dev/null && kill "$host"
-  wait "$host"
-  tr -d '\r' <"$work/out"
-}
-
 finish() {  # finish NAME: Escape in the tree ends the browse with nil
   keys "$frame" Escape
   check "$1: Escape gives nil" "nil" "$(ended)"
