@@ -27,28 +27,21 @@ class LispEvaluator : public ::testing::Test {
             [this](const std::wstring &text) { output += text; }) {}
 
   // The last form's result as prin1 writes it.
-  std::wstring Run(const std::wstring &source) {
+  std::wstring Run(const std::wstring &source) { return Session(m_evaluator, source); }
+  static std::wstring Session(lisp::Evaluator &evaluator, const std::wstring &source) {
     Value result;
-    for (const Value &form : lisp::ReadAll(source)) result = m_evaluator.Eval(form);
+    for (const Value &form : lisp::ReadAll(source)) result = evaluator.Eval(form);
     return lisp::Prin1(result);
   }
 
-  std::wstring WideFailure(const std::wstring &source) {
+  // The message of the error the source ends with.
+  std::wstring Fails(const std::wstring &source) {
     try {
       Run(source);
     } catch (const lisp::Error &error) {
       return lisp::WideMessage(error);
     }
     return L"(no error)";
-  }
-
-  std::string Fails(const std::wstring &source) {
-    try {
-      Run(source);
-    } catch (const lisp::Error &error) {
-      return error.what();
-    }
-    return "(no error)";
   }
 
   lisp::Evaluator m_evaluator;
@@ -89,9 +82,7 @@ TEST_F(LispEvaluator, VariablesListsArithmeticAndComparisons) {
     lisp::Evaluator session(nullptr, nullptr);
     std::string outcome;
     try {
-      Value result;
-      for (const Value &form : lisp::ReadAll(source)) result = session.Eval(form);
-      const std::wstring printed = lisp::Prin1(result);
+      const std::wstring printed = Session(session, source);
       outcome.assign(printed.begin(), printed.end());
     } catch (const lisp::Error &error) {
       outcome = std::string("error: ") + error.what();
@@ -116,8 +107,8 @@ TEST_F(LispEvaluator, StrcatPrincAndPrin1) {
     EXPECT_EQ(output, printed) << source;
   }
   EXPECT_EQ(m_evaluator.Eval(lisp::ReadAll(L"(princ)").front()), Value::Void());
-  EXPECT_EQ(Fails(L"(strcat \"a\" 1)"), "bad argument type: stringp 1");
-  EXPECT_EQ(Fails(L"(princ 1 \"file\")"), "bad argument type: streamp \"file\"");
+  EXPECT_EQ(Fails(L"(strcat \"a\" 1)"), L"bad argument type: stringp 1");
+  EXPECT_EQ(Fails(L"(princ 1 \"file\")"), L"bad argument type: streamp \"file\"");
 }
 
 TEST_F(LispEvaluator, ExternalFunctionsGetTheUpperCasedNameAndEvaluatedArguments) {
@@ -127,8 +118,8 @@ TEST_F(LispEvaluator, ExternalFunctionsGetTheUpperCasedNameAndEvaluatedArguments
   EXPECT_EQ(lisp::Prin1(calls[0]), LR"((LUMVEX (0 2 "Z:\\work\\" "Insert" nil)))");
 
   EXPECT_EQ(m_evaluator.Eval(lisp::ReadAll(L"(quiet)").front()), Value::Void());
-  EXPECT_EQ(Fails(L"(foo 1 (car \"x\"))"), "bad argument type: consp \"x\"");
-  EXPECT_EQ(Fails(L"(foo (princ \"evaluated first\"))"), "no function definition: FOO");
+  EXPECT_EQ(Fails(L"(foo 1 (car \"x\"))"), L"bad argument type: consp \"x\"");
+  EXPECT_EQ(Fails(L"(foo (princ \"evaluated first\"))"), L"no function definition: FOO");
   EXPECT_EQ(output, L"evaluated first");
 
   lisp::Evaluator withoutModule(nullptr, nullptr);
@@ -139,9 +130,9 @@ TEST_F(LispEvaluator, ExternalFunctionsGetTheUpperCasedNameAndEvaluatedArguments
 // Messages are UTF-8 inside lisp::Error; names and printed values beyond ASCII, and characters
 // beyond 16 bits, come back intact as wide text.
 TEST_F(LispEvaluator, ErrorMessagesKeepWideText) {
-  EXPECT_EQ(WideFailure(L"(caf\u00e9 1)"), L"no function definition: CAF\u00c9");
-  EXPECT_EQ(WideFailure(L"(strcat \"a\" 'caf\u00e9)"), L"bad argument type: stringp CAF\u00c9");
-  EXPECT_EQ(WideFailure(L"(\"\U0001F600\u4e2d\")"), L"bad function: \"\U0001F600\u4e2d\"");
+  EXPECT_EQ(Fails(L"(caf\u00e9 1)"), L"no function definition: CAF\u00c9");
+  EXPECT_EQ(Fails(L"(strcat \"a\" 'caf\u00e9)"), L"bad argument type: stringp CAF\u00c9");
+  EXPECT_EQ(Fails(L"(\"\U0001F600\u4e2d\")"), L"bad function: \"\U0001F600\u4e2d\"");
 }
 
 TEST_F(LispEvaluator, NestingDepthIsBounded) {

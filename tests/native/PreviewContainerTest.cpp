@@ -43,11 +43,6 @@ std::optional<PreviewDirectory> directoryOf(const Bytes &file) {
   return readPreviewDirectory(source);
 }
 
-std::vector<PreviewEntry> picturesOf(const Bytes &file) {
-  auto directory = directoryOf(file);
-  return directory ? picturesByPreference(*directory) : std::vector<PreviewEntry>{};
-}
-
 struct FixtureCase {
   const char *file;
   bool hasDirectory;
@@ -135,7 +130,7 @@ TEST(PreviewDirectory, PreferencePngThenLargestBitmapThenMetafile) {
   const Bytes file = previewtest::buildDrawing({previewtest::headerData(), {kMetafile, Bytes(500, 0)}, {kBitmap, Bytes(100, 0)},
                                                 {9, Bytes(900, 0)}, {kBitmap, Bytes(300, 0)}, {kPng, Bytes(50, 0)}, {kBitmap, Bytes()}});
   std::vector<std::pair<int, uint32_t>> pictures;
-  for (const PreviewEntry &entry : picturesOf(file)) pictures.emplace_back(entry.code, entry.size);
+  for (const PreviewEntry &entry : picturesByPreference(*directoryOf(file))) pictures.emplace_back(entry.code, entry.size);
   EXPECT_EQ(pictures, (std::vector<std::pair<int, uint32_t>>{{kPng, 50}, {kBitmap, 300}, {kBitmap, 100}, {kMetafile, 500}}))
       << "header data, unknown codes and empty entries are no pictures";
 }

@@ -13,6 +13,7 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <filesystem>
 #include <memory>
 #include <string>
 #include <vector>
@@ -50,12 +51,6 @@ void AddFile(const ScratchFolder &folder, const std::string &name, size_t size =
   CloseHandle(file);
 }
 
-std::string CurrentDirectory() {
-  char path[MAX_PATH] = "";
-  GetCurrentDirectoryA(MAX_PATH, path);
-  return path;
-}
-
 class CatalogueScan : public ::testing::Test {
  protected:
   void TearDown() override {
@@ -87,7 +82,7 @@ TEST_F(CatalogueScan, TakesDrawingsInListingOrderWithTheirTimeAndSizeUnmarked) {
       record.Select();  // a second scan gives them unmarked
     }
   }
-  EXPECT_EQ(CurrentDirectory(), folder.Path()) << "the scanned folder becomes the current directory";
+  EXPECT_EQ(std::filesystem::current_path().string(), folder.Path()) << "the scanned folder becomes the current directory";
   EXPECT_EQ(m_document->m_strPath, folder.Path()) << "and the shown folder";
 }
 
@@ -101,9 +96,9 @@ TEST_F(CatalogueScan, EmptyUnlistableOrMissingFoldersLeaveAnEmptyCatalogue) {
     EXPECT_EQ(g_pCatalogue->GetSize(), 0) << path;
     EXPECT_EQ(m_document->m_strPath, path);
   }
-  EXPECT_EQ(CurrentDirectory(), folder.Path()) << "a folder that is not there cannot become current";
+  EXPECT_EQ(std::filesystem::current_path().string(), folder.Path()) << "a folder that is not there cannot become current";
   EXPECT_TRUE(ScanFolder("C:\\", kDwg)) << "a drive root despite its own separator";
-  EXPECT_EQ(CurrentDirectory(), "C:\\");
+  EXPECT_EQ(std::filesystem::current_path().string(), "C:\\");
 }
 
 int Sign(int value) { return (value > 0) - (value < 0); }

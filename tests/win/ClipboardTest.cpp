@@ -76,11 +76,8 @@ std::string ReadClipboardInAnotherProcess() {
     output = "reader did not start";
   }
   CloseHandle(readEnd);
-  std::string lines;
-  for (char c : output) {
-    if (c != '\r') lines.push_back(c);
-  }
-  return lines;
+  output.erase(std::remove(output.begin(), output.end(), '\r'), output.end());
+  return output;
 }
 
 // Puts a file-list block on the clipboard with the plain clipboard calls, as other programs do.
@@ -140,13 +137,21 @@ TEST(ClipboardBlock, SharedFileGrowsInWholeStepsOfZeroedMemory) {
   EXPECT_EQ(bytes, header + longPath + std::string(8192 - 5020, '\0'));
 }
 
-TEST(ClipboardCopy, MarkedDrawingsAreReadBackByAnotherProcess) {
+TEST(ClipboardCopy, MarkedDrawingsAreReadBackByAnotherProcessAndPasteIntoAnotherFolder) {
+  ScratchFolder source("copy-source"), target("copy-target");
+  for (const char *name : {"a.dwg", "b.dwg", "c.dwg"}) source.File(name, name);
   DwgCatalogue catalogue = Catalogue({"a.dwg", "b.dwg", "c.dwg"});
   catalogue[0].Select();
   catalogue[2].Select();
-  ASSERT_TRUE(CopySelected(catalogue, "C:\\Work"));
-  EXPECT_EQ(ReadClipboardInAnotherProcess(), "offset=20 wide=0\nC:\\Work\\a.dwg\nC:\\Work\\c.dwg\n");
+  ASSERT_TRUE(CopySelected(catalogue, source.Path()));
+  EXPECT_EQ(ReadClipboardInAnotherProcess(), "offset=20 wide=0\n" + source.File("a.dwg") + "\n" + source.File("c.dwg") + "\n");
+  CurrentDirectory here(target.Path());
   EXPECT_TRUE(ForFileCommands().CanPaste());
+  EXPECT_TRUE(PasteFiles());
+  EXPECT_EQ(Content(target.File("a.dwg")), "a.dwg");
+  EXPECT_EQ(Content(target.File("c.dwg")), "c.dwg");
+  EXPECT_FALSE(fs::exists(target.File("b.dwg")));
+  EXPECT_EQ(Content(source.File("a.dwg")), "a.dwg");
 }
 
 TEST(ClipboardCopy, NothingMarkedLeavesAnEmptyListThatPastesNothing) {
@@ -157,21 +162,6 @@ TEST(ClipboardCopy, NothingMarkedLeavesAnEmptyListThatPastesNothing) {
   EXPECT_FALSE(ForFileCommands().CanPaste());
   EXPECT_FALSE(PasteFiles());
   EXPECT_TRUE(fs::is_empty(target.Path()));
-}
-
-TEST(ClipboardCopy, CopiedDrawingsPasteIntoAnotherFolder) {
-  ScratchFolder source("copy-source"), target("copy-target");
-  source.File("a.dwg", "alpha");
-  source.File("b.dwg", "beta");
-  DwgCatalogue catalogue = Catalogue({"a.dwg", "b.dwg"});
-  catalogue[0].Select();
-  catalogue[1].Select();
-  ASSERT_TRUE(CopySelected(catalogue, source.Path()));
-  CurrentDirectory here(target.Path());
-  EXPECT_TRUE(PasteFiles());
-  EXPECT_EQ(Content(target.File("a.dwg")), "alpha");
-  EXPECT_EQ(Content(target.File("b.dwg")), "beta");
-  EXPECT_EQ(Content(source.File("a.dwg")), "alpha");
 }
 
 // Paste is offered when a drawing in any case is listed, and pastes every file listed.

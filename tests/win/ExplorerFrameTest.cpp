@@ -6,7 +6,6 @@
 #include <gtest/gtest.h>
 #include <shlobj.h>
 
-
 namespace {
 constexpr int kAccept = 32795;
 constexpr int kCancel = 32796;
@@ -35,6 +34,11 @@ std::string IniValue(const std::string &ini, const std::string &key) {
 }
 
 void Command(HWND frame, int id) { PostMessageA(frame, WM_COMMAND, id, 0); }
+std::string StatusText(HWND frame) {
+  char text[128] = "";
+  SendMessageA(FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr), SB_GETTEXTA, 0, reinterpret_cast<LPARAM>(text));
+  return text;
+}
 
 using ExplorerFrame = BrowseTest;
 
@@ -71,9 +75,7 @@ TEST_F(ExplorerFrame, LayoutOfToolBarsLabelsCaptionsAndStatusBar) {
     acceptEnabled = SendMessageA(bars[1], TB_ISBUTTONENABLED, kAccept, 0) != 0;
     HWND status = FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr);
     statusParts = static_cast<int>(SendMessageA(status, SB_GETPARTS, 0, 0));
-    char text[128] = "";
-    SendMessageA(status, SB_GETTEXTA, 0, reinterpret_cast<LPARAM>(text));
-    statusText = text;
+    statusText = StatusText(frame);
     hostEnabledDuring = IsWindowEnabled(host);
     Command(frame, kCancel);
   });
@@ -182,9 +184,17 @@ TEST_F(ExplorerFrame, AcceptReturnsThePathWithTheFolderSettingsOrThreeEmptyTexts
   EXPECT_EQ(IniValue(m_state.Read(), "Path"), "C:\\");
 }
 
-TEST_F(ExplorerFrame, ToolBarAndStatusBarCommandsHideThemAndClearTheirCheckMarks) {
-  std::vector<bool> shown;  // top bar, bottom bar, status bar, the two check marks
+TEST_F(ExplorerFrame, MenuPromptsShowInTheStatusBarAndItsCommandHidesItAndTheToolBar) {
+  std::vector<std::string> prompts;  // a command's, a popup's, after the menu closes
+  std::vector<bool> shown;           // top bar, bottom bar, status bar, the two check marks
   Browse(BrowseArgs(L""), [&](HWND frame) {
+    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(kSortByName, MF_STRING),
+                 reinterpret_cast<LPARAM>(GetSubMenu(GetMenu(frame), 2)));
+    prompts.push_back(StatusText(frame));
+    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(0, MF_POPUP), reinterpret_cast<LPARAM>(GetMenu(frame)));
+    prompts.push_back(StatusText(frame));
+    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(0, 0xFFFF), 0);
+    prompts.push_back(StatusText(frame));
     const std::vector<HWND> bars = ToolBars(frame);
     SendMessageA(frame, WM_COMMAND, kViewToolbar, 0);
     SendMessageA(frame, WM_COMMAND, kViewStatusBar, 0);
@@ -196,6 +206,7 @@ TEST_F(ExplorerFrame, ToolBarAndStatusBarCommandsHideThemAndClearTheirCheckMarks
              (GetMenuState(view, kViewStatusBar, MF_BYCOMMAND) & MF_CHECKED) != 0};
     Command(frame, kCancel);
   });
+  EXPECT_EQ(prompts, (std::vector<std::string>{"Sort by name", "", "Ready"}));
   EXPECT_EQ(shown, (std::vector<bool>{false, true, false, false, false})) << "the toggle is the top tool bar's";
 }
 
@@ -229,29 +240,6 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
     EXPECT_NE(GetFileAttributesA((folder + "\\door.dwg").c_str()), INVALID_FILE_ATTRIBUTES) << "the drawing was pasted";
   }
 }
-std::string StatusText(HWND frame) {
-  char text[128] = "";
-  SendMessageA(FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr), SB_GETTEXTA, 0, reinterpret_cast<LPARAM>(text));
-  return text;
-}
-
-TEST_F(ExplorerFrame, MenuPromptsShowInTheStatusBarAndReadyComesBack) {
-  std::string prompt, separator, ready;
-  Browse(BrowseArgs(L""), [&](HWND frame) {
-    HMENU sort = GetSubMenu(GetMenu(frame), 2);
-    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(kSortByName, MF_STRING), reinterpret_cast<LPARAM>(sort));
-    prompt = StatusText(frame);
-    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(0, MF_POPUP), reinterpret_cast<LPARAM>(GetMenu(frame)));
-    separator = StatusText(frame);
-    SendMessageA(frame, WM_MENUSELECT, MAKEWPARAM(0, 0xFFFF), 0);
-    ready = StatusText(frame);
-    Command(frame, kCancel);
-  });
-  EXPECT_EQ(prompt, "Sort by name");
-  EXPECT_EQ(separator, "");
-  EXPECT_EQ(ready, "Ready");
-}
-
 TEST_F(ExplorerFrame, FrameAcceleratorsWorkInsideTheModalLoop) {
   HWND focus = nullptr, rightPane = nullptr;
   Browse(BrowseArgs(L""), [&](HWND frame) {

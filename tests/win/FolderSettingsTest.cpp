@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <functional>
+#include <tuple>
 
 namespace {
 constexpr int kLayer = 1017, kUseCurrent = 1081, kSwatch = 200, kCommand = 201, kAccept = 32795;
@@ -38,6 +39,7 @@ struct Shown {
   bool checked = false, layerEnabled = false, swatchEnabled = false, openAfterAccept = false;
   std::string layer, command;
   COLORREF swatch = CLR_INVALID;
+  auto Fields() const { return std::tie(checked, layerEnabled, swatchEnabled, openAfterAccept, layer, command, swatch); }
 };
 
 struct Case {
@@ -128,13 +130,7 @@ TEST_F(FolderSettings, DialogRulesAndTheBrowseResult) {
     });
     SCOPED_TRACE(c.name);
     ASSERT_TRUE(outcome.watcherFoundFrame);
-    EXPECT_EQ(shown.checked, c.expected.checked);
-    EXPECT_EQ(shown.layerEnabled, c.expected.layerEnabled);
-    EXPECT_EQ(shown.swatchEnabled, c.expected.swatchEnabled);
-    EXPECT_EQ(shown.layer, c.expected.layer);
-    EXPECT_EQ(shown.command, c.expected.command);
-    EXPECT_EQ(shown.swatch, c.expected.swatch);
-    EXPECT_EQ(shown.openAfterAccept, c.expected.openAfterAccept);
+    EXPECT_EQ(shown.Fields(), c.expected.Fields());
     const std::vector<HostEvent> events = HostEvents();
     const bool alerted = std::find(events.begin(), events.end(), Alerted(L"Name of layer is empty")) != events.end();
     EXPECT_EQ(alerted, c.expected.openAfterAccept);

@@ -42,8 +42,6 @@ std::vector<Entry> Entries(HMENU menu) {
   return entries;
 }
 
-const std::vector<Entry> kSortEntries = {{32799, L"By &Name"}, {32788, L"By &Date"}, {32789, L"By &Size"}};
-
 TEST(Menus, FrameMenuOffersEveryCommandUnderItsHeading) {
   const HMENU menu = LoadMenuW(Module(), MAKEINTRESOURCEW(128));
   ASSERT_TRUE(menu);
@@ -57,7 +55,7 @@ TEST(Menus, FrameMenuOffersEveryCommandUnderItsHeading) {
                                                               {0, L""},
                                                               {59392, L"&Toolbar"},
                                                               {59393, L"&Status Bar"}}));
-  EXPECT_EQ(Entries(GetSubMenu(menu, 2)), kSortEntries);
+  EXPECT_EQ(Entries(GetSubMenu(menu, 2)), (std::vector<Entry>{{32799, L"By &Name"}, {32788, L"By &Date"}, {32789, L"By &Size"}}));
   EXPECT_EQ(Entries(GetSubMenu(menu, 3)), (std::vector<Entry>{{57664, L"&About"}, {57670, L"&Help"}}));
 }
 
@@ -174,7 +172,7 @@ TEST(Dialogs, FolderSettingsControlsInTheirOrder) {
   EXPECT_TRUE(controls[5].style & SS_NOTIFY) << "the swatch reports clicks";
 }
 
-TEST(Dialogs, AboutBoxShowsTheIconTheModuleNameAndAWayToClose) {
+TEST(Dialogs, AboutBoxShowsTheIconTheModuleNameAndAWayToCloseAndTheIconsAndCursorLoad) {
   std::wstring title;
   bool icon = false, name = false, ok = false;
   for (const Control &c : Controls(100, title)) {
@@ -184,9 +182,6 @@ TEST(Dialogs, AboutBoxShowsTheIconTheModuleNameAndAWayToClose) {
   }
   EXPECT_EQ(title, L"About Lumvex1");
   EXPECT_TRUE(icon && name && ok) << icon << name << ok;
-}
-
-TEST(Icons, TheWindowIconTheAboutIconAndTheLoadingCursor) {
   for (int id : {128, 221}) EXPECT_TRUE(LoadImageW(Module(), MAKEINTRESOURCEW(id), IMAGE_ICON, 16, 16, 0)) << id;
   EXPECT_TRUE(FindResourceW(Module(), MAKEINTRESOURCEW(131), MAKEINTRESOURCEW(21)));  // RT_ANICURSOR
 }

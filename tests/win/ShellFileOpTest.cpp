@@ -33,7 +33,7 @@ TEST(ShellFileOp, SourceAndDestinationListsAreIndependent) {
   EXPECT_EQ(ListBytes(operation, 1), std::string("D:\\target\0\0", 11));
 }
 
-TEST(ShellFileOp, TitleIsAPrivateCopyAndEmptyTextClearsIt) {
+TEST(ShellFileOp, TitleIsAPrivateCopyOfATextOrAStringResourceAndEmptyOrMissingClearsIt) {
   CShellFileOp operation;
   char text[] = "Copying drawings";
   operation.SetTitle(text);
@@ -42,14 +42,8 @@ TEST(ShellFileOp, TitleIsAPrivateCopyAndEmptyTextClearsIt) {
   EXPECT_STREQ(operation.GetOperation().lpszProgressTitle, "Copying drawings");
   operation.SetTitle("");
   EXPECT_EQ(operation.GetOperation().lpszProgressTitle, nullptr);
-}
-
-TEST(ShellFileOp, TitleFromAStringResource) {
   // Wine's shell keeps its own confirmation captions as strings: a module with known texts.
-  HMODULE shell = GetModuleHandleA("shell32.dll");
-  ASSERT_NE(shell, nullptr);
-  fw::AfxSetResourceHandle(shell);
-  CShellFileOp operation;
+  fw::AfxSetResourceHandle(GetModuleHandleA("shell32.dll"));
   operation.SetTitle(130u);
   ASSERT_NE(operation.GetOperation().lpszProgressTitle, nullptr);
   EXPECT_STREQ(operation.GetOperation().lpszProgressTitle, "Confirm file deletion");
