@@ -14,12 +14,18 @@ CWaitingTreeCtrl::~CWaitingTreeCtrl() = default;
 void CWaitingTreeCtrl::SetProgress(int total, int done) {
   m_nTotal = total;
   m_nDone = done;
-  if (m_hProgressEvent) SetEvent(m_hProgressEvent.Get());
+  SignalProgress();
 }
 
 void CWaitingTreeCtrl::StepProgress(int n) {
   m_nDone += n;
-  if (m_hProgressEvent) SetEvent(m_hProgressEvent.Get());
+  SignalProgress();
+}
+
+// The progress event resets when the thread wakes on it: until then, setting it again would
+// change nothing, so it is set once between two of the thread's progress steps.
+void CWaitingTreeCtrl::SignalProgress() {
+  if (m_hProgressEvent && !m_bProgressSignalled.exchange(1)) SetEvent(m_hProgressEvent.Get());
 }
 
 int CWaitingTreeCtrl::GetProgress(int *total) const {
@@ -64,7 +70,7 @@ LRESULT CWaitingTreeCtrl::WindowProc(UINT message, WPARAM wParam, LPARAM lParam)
     BitBlt(target, 0, 0, info.bmWidth, info.bmHeight, source, 0, 0, SRCCOPY);
     SelectObject(source, previous);
     DeleteDC(source);
-    if (m_hProgressEvent) SetEvent(m_hProgressEvent.Get());
+    SignalProgress();
     return 1;
   }
   return CTreeCtrl::WindowProc(message, wParam, lParam);
@@ -134,6 +140,7 @@ void CWaitingTreeCtrl::StartAnimation() {
   m_bStop = 0;
   m_hTickEvent.Reset(CreateEventA(nullptr, FALSE, TRUE, nullptr));
   m_hProgressEvent.Reset(CreateEventA(nullptr, FALSE, TRUE, nullptr));
+  m_bProgressSignalled = 1;
   // Without its events or its thread the load runs all the same, only without animation.
   if (!m_hTickEvent || !m_hProgressEvent) return;
   m_hThread.Reset(CreateThread(nullptr, 0, AnimationThread, this, 0, nullptr));
@@ -165,6 +172,7 @@ void CWaitingTreeCtrl::Animate() {
   do {
     const DWORD woken = WaitForMultipleObjects(2, events, FALSE, INFINITE);
     if (m_bStop || (woken != WAIT_OBJECT_0 && woken != WAIT_OBJECT_0 + 1)) return;
+    if (woken == WAIT_OBJECT_0 + 1) m_bProgressSignalled = 0;  // before the values are read
     int total = 0;
     const int done = GetProgress(&total);
     OnWaitTick(woken == WAIT_OBJECT_0, total, done);

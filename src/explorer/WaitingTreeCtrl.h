@@ -56,6 +56,7 @@ class CWaitingTreeCtrl : public fw::CTreeCtrl {
   KernelHandle m_hThread;
   KernelHandle m_hTickEvent;
   KernelHandle m_hProgressEvent;
+  std::atomic<int> m_bProgressSignalled{0};
   std::atomic<int> m_bStop{0};
   int m_bSnapshotValid = 0;
   BitmapHandle m_hSnapshot;
@@ -76,6 +77,7 @@ class CWaitingTreeCtrl : public fw::CTreeCtrl {
   void Animate();
   void StartAnimation();
   void StopAnimation();
+  void SignalProgress();
   void EraseIconArea();
   void TakeSnapshot();
   void DropSnapshot();
