@@ -33,6 +33,14 @@ window() {  # window TITLE-REGEX: the visible window, waiting for it
   xdotool search --onlyvisible --name "$1" 2>/dev/null | head -n 1
 }
 
+placed() {  # placed WINDOW WIDTH HEIGHT: its X Y WIDTH HEIGHT once it has that size (or after 15 s)
+  for _ in $(seq 60); do
+    eval "$(xdotool getwindowgeometry --shell "$1" 2>/dev/null)"
+    [ "${WIDTH:-0}x${HEIGHT:-0}" == "$2x$3" ] && return
+    sleep 0.25
+  done
+}
+
 named() {  # named WINDOW EXPECTED: the window's title once it reads EXPECTED (or after 15 s)
   local name=""
   for _ in $(seq 150); do

@@ -35,12 +35,11 @@ printf '[Size]\r\nSplitterSize=260\r\nWindowWidth=1000\r\nWindowHeight=700\r\n' 
 browse "$(echo "$plans" | tr '[:lower:]' '[:upper:]')\\"
 title='Plans$'
 frame=$(window "$title")
+placed "$frame" 1000 700
 check "a start folder in other case opens the folder" "$plans" "$(xdotool getwindowname "$frame" 2>/dev/null)"
 
 # Down to Archive, open it and look while its children load.
 keys "$frame" Down
-X=0 Y=0 HEIGHT=300
-eval "$(xdotool getwindowgeometry --shell "$frame" 2>/dev/null)"
 xdotool key Right 2>/dev/null
 bar() {  # bar SHOT: 1 when the tree pane shows red, the bar's fill (the Close cross lies outside)
   import -window root "$1"
@@ -91,6 +90,7 @@ ini="$work/Plans/Details/datains.ini"
 
 browse ""
 frame=$(window 'Details$')
+placed "$frame" 1000 700
 check "the next browse opens at the remembered folder" "$plans\\Details" "$(xdotool getwindowname "$frame" 2>/dev/null)"
 settings
 keys "$dialog" alt+u shift+Tab
@@ -109,6 +109,7 @@ check "the accepted drawing carries the folder's defaults" \
 
 browse ""
 frame=$(window 'plan.dwg$')
+placed "$frame" 1000 700
 shown=$(highlight)
 read -r x y _ h <<<"$shown"
 xdotool mousemove $((x + 10)) $((y + h / 2 - 16)) click 3 sleep 0.5 key Escape  # Archive, just above

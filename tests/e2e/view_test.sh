@@ -16,14 +16,13 @@ printf '[Size]\r\nSplitterSize=150\r\nWindowWidth=1000\r\nWindowHeight=700\r\n\r
 host=$!
 frame=$(window '^Z:')
 check "the explorer shows the folder" "$folder" "$(xdotool getwindowname "$frame" 2>/dev/null)"
-# The frame shows, and its title names the folder, before it takes its remembered size and place
-# and before the view has built its tiles: read its place again until it has that size and the
-# first tile's picture shows there, dark beside the white gap between two columns.
+# The frame shows, and its title names the folder, before it takes its remembered size and
+# place, and before the view has built its tiles: the first tile's picture shows there at last,
+# dark beside the white gap between two columns.
+placed "$frame" 1000 700
+# The view starts below the tool bar, right of the folder pane; 4 columns 178 pixels apart, rows 163.
+view_x=$((X + 163)) view_y=$((Y + 74))
 for _ in $(seq 60); do
-  eval "$(xdotool getwindowgeometry --shell "$frame")"
-  # The view starts below the tool bar, right of the folder pane; 4 columns 178 pixels apart, rows 163.
-  view_x=$((X + 163)) view_y=$((Y + 74))
-  [ "$WIDTH x $HEIGHT" == "1000 x 700" ] || { sleep 0.25; continue; }
   import -window root "$work/shot.png"
   [ "$(convert "$work/shot.png" -format '%[fx:p{'$((view_x + 6))','$((view_y + 6))'}.r<0.5 && p{'$((view_x + 175))','$((view_y + 70))'}.r>0.5 ? 1 : 0]' info:)" == 1 ] && break
   sleep 0.25
