@@ -4,20 +4,34 @@
 # fills, another folder chosen with the keys, Tab over to the thumbnail view and Escape from
 # there, the next browses opening at the remembered folder, and its defaults set through a right
 # click on its tree item: taken with an accepted drawing, then dropped with "Use current layer".
+# Everything lies on a drive of the script's own, so each key can only reach what it made.
 # Usage: tree_test.sh BIN_DIR REPO_ROOT SCREENSHOT_DIR
 source "$(dirname "$0")/common.sh" "$@"
-mkdir -p "$work/Plans/Details"
-(cd "$work/Plans" && mkdir -p Archive && cd Archive && seq -f 'f%05g' 20000 | xargs mkdir)
-python3 "$root/tools/make_sample_drawings.py" "$work/one" 1 >/dev/null && mv "$work"/one/* "$work/Plans/Details/plan.dwg"
-plans="Z:${work//\//\\}\\Plans"
-
+mkdir -p "$world/Plans/Details" "$world/Plans/Archive"
+(cd "$world/Plans/Archive" && seq -f 'f%05g' 20000 | xargs mkdir)
+python3 "$root/tools/make_sample_drawings.py" "$work/one" 1 >/dev/null && mv "$work"/one/* "$world/Plans/Details/plan.dwg"
+plans="$drive\\Plans"
+ini="$world/Plans/Details/datains.ini"
 
 keys() {  # keys WINDOW KEY...
   local target=$1
   shift
   xdotool windowfocus --sync "$target" >/dev/null 2>&1
   xdotool key --clearmodifiers --delay 150 "$@" 2>/dev/null
-  sleep 0.4
+}
+
+choose() {  # choose KEY FOLDER: KEY in the tree until the frame shows FOLDER, or stops naming it
+  local before now
+  before=$(title "$frame")
+  for _ in 1 2 3; do
+    keys "$frame" "$1"
+    # A key that comes while the frame takes the focus, or as a load ends, is now and then lost
+    # under a busy X server: it is pressed again only when the title has not moved at all.
+    now=$(named "$frame" "$2")
+    [ "$now" == "$2" ] && return
+    [ "$now" != "$before" ] && stop "$1 was to choose $2, but the frame shows $now"
+  done
+  stop "$1 was to choose $2, but the frame still shows $before"
 }
 
 browse() {  # browse START-FOLDER: runs a browse call in the background
@@ -26,96 +40,78 @@ browse() {  # browse START-FOLDER: runs a browse call in the background
   host=$!
 }
 
-finish() {  # finish NAME: Escape in the tree ends the browse with nil
+finish() {  # finish NAME: Escape ends the browse with nil
   keys "$frame" Escape
   check "$1: Escape gives nil" "nil" "$(ended)"
 }
 
 printf '[Size]\r\nSplitterSize=260\r\nWindowWidth=1000\r\nWindowHeight=700\r\n' >"$state"
 browse "$(echo "$plans" | tr '[:lower:]' '[:upper:]')\\"
-title='Plans$'
-frame=$(window "$title")
+window frame 'Plans$'
 placed "$frame" 1000 700
-check "a start folder in other case opens the folder" "$plans" "$(xdotool getwindowname "$frame" 2>/dev/null)"
+must "a start folder in other case opens the folder" "$plans" "$(title "$frame")"
 
-# Down to Archive, open it and look while its children load.
-keys "$frame" Down
-xdotool key Right 2>/dev/null
-bar() {  # bar SHOT: 1 when the tree pane shows red, the bar's fill (the Close cross lies outside)
-  import -window root "$1"
-  convert "$1" -crop "260x$((HEIGHT - 160))+$X+$((Y + 60))" +repage -fill black +opaque '#FF0000' \
-    -format '%[fx:maxima.r>0?1:0]' info:
-}
-red=0
-for i in 1 2 3; do [ "$(bar "$shots/tree-loading-$i.png")" == 1 ] && red=1; done
-check "the progress bar shows while 20,000 folders load" 1 "$red"
-for _ in $(seq 60); do [ "$(bar "$work/loaded.png")" == 0 ] && break; sleep 0.5; done
+# Down to Archive, open it and watch the tree while its 20,000 children load: the bar's red fill
+# shows on the screen. The watch begins before the key, so that no load is too quick for it.
+choose Down "$plans\\Archive"
+"$run" "$bin/WindowProbe.exe" tree-load "$drive" >"$work/load" 2>&1 &
+watcher=$!
+until_true 15 grep -q watching "$work/load" || stop "waiting for the watch of the tree to begin"
+keys "$frame" Right
+until_true 30 eval '! kill -0 $watcher 2>/dev/null' || stop "waiting for the load of 20,000 folders to end"
+check "the progress bar shows while 20,000 folders load" "watching red" "$(tr -d '\r' <"$work/load" | xargs)"
 keys "$frame" Left
-for _ in 1 2 3; do  # a key pressed as the load ends is now and then lost under a busy X server
-  keys "$frame" Down
-  [ "$(xdotool getwindowname "$frame" 2>/dev/null)" == "$plans\\Archive" ] || break
-done
-check "the keys choose the next folder once the load is done" "$plans\\Details" "$(named "$frame" "$plans\\Details")"
+choose Down "$plans\\Details"
 keys "$frame" Tab
 finish "first browse"
 
-highlight() {  # highlight: the highlighted tree items' box on the screen, as X Y WIDTH HEIGHT
-  local X Y WIDTH HEIGHT w h x y
-  for _ in $(seq 20); do  # until the frame has settled where it is shown
-    eval "$(xdotool getwindowgeometry --shell "$frame" 2>/dev/null)"
-    import -window root "$shots/tree-settings.png"
-    IFS='x+' read -r w h x y < <(convert "$shots/tree-settings.png" -crop "260x$((HEIGHT - 160))+$X+$((Y + 60))" \
-      +repage -fill black +opaque 'rgb(48,150,250)' -format '%@' info: 2>/dev/null)
-    [ "$w" -gt 0 ] && break
-    sleep 0.25
-  done
-  echo $((X + x)) $((Y + 60 + y)) "$w" "$h"
-}
-
 settings() {  # settings: right click on the shown folder's tree item and choose the menu
-  local x y w h
-  read -r x y w h < <(highlight)
+  local item
+  locate item tree-item "$drive"
   # Under a busy X server the first click of a popup menu is now and then lost: try again.
   for _ in 1 2 3; do
-    xdotool mousemove $((x + w / 2)) $((y + h / 2)) click 3 sleep 0.5
-    # The menu opens at the item's lower right corner.
-    xdotool mousemove $((x + w + 40)) $((y + h + 11)) click 1 sleep 1
-    dialog=$(xdotool search --onlyvisible --name '^Folder settings$' 2>/dev/null | head -n 1)
-    [ -n "$dialog" ] && break
+    xdotool mousemove $(middle "$item") click 3 sleep 0.3 key f
+    until_true 3 shown '^Folder settings$' && break
     xdotool key Escape
   done
-  dialog=$(window '^Folder settings$')
+  window dialog '^Folder settings$'
 }
-ini="$work/Plans/Details/datains.ini"
 
 browse ""
-frame=$(window 'Details$')
+window frame 'Details$'
 placed "$frame" 1000 700
-check "the next browse opens at the remembered folder" "$plans\\Details" "$(xdotool getwindowname "$frame" 2>/dev/null)"
+must "the next browse opens at the remembered folder" "$plans\\Details" "$(title "$frame")"
 settings
 keys "$dialog" alt+u shift+Tab
 xdotool type --delay 80 WALLS
 keys "$dialog" Tab Tab
 xdotool type --delay 80 MYCMD
-eval "$(xdotool getwindowgeometry --shell "$dialog" 2>/dev/null | sed 's/^/D/')"
-xdotool mousemove $((DX + DWIDTH * 193 / 212)) $((DY + 44)) click 1  # the colour swatch
-keys "$(window '^Select Color$')" 1 Return
+locate swatch control 'Folder settings' 200
+xdotool mousemove $(middle "$swatch") click 1
+window colors '^Select Color$'
+keys "$colors" 1 Return
 keys "$dialog" Return
-check "folder settings saved" "[Default Parameters] Layer=WALLS Lisp command=MYCMD Color=1" "$(tr -d '\r' <"$ini" | xargs)"
-eval "$(xdotool getwindowgeometry --shell "$frame" 2>/dev/null)"
-xdotool mousemove $((X + 360)) $((Y + 150)) click --repeat 2 --delay 80 1
+saved_as() { [ "$(tr -d '\r' <"$ini" 2>/dev/null | xargs)" == "$1" ]; }
+expected_ini="[Default Parameters] Layer=WALLS Lisp command=MYCMD Color=1"
+until_true 10 saved_as "$expected_ini"
+check "folder settings saved" "$expected_ini" "$(tr -d '\r' <"$ini" 2>/dev/null | xargs)"
+locate drawing tile "$drive" plan.dwg
+xdotool mousemove $(middle "$drawing") click --repeat 2 --delay 80 1
 check "the accepted drawing carries the folder's defaults" \
   "(\"${plans//\\/\\\\}\\\\Details\\\\plan.dwg\" (\"WALLS\" \"1\" \"MYCMD\"))" "$(ended)"
 
 browse ""
-frame=$(window 'plan.dwg$')
+window frame 'plan.dwg$'
 placed "$frame" 1000 700
-shown=$(highlight)
-read -r x y _ h <<<"$shown"
-xdotool mousemove $((x + 10)) $((y + h / 2 - 16)) click 3 sleep 0.5 key Escape  # Archive, just above
-check "another folder's menu leaves the highlight on the folder shown" "$shown" "$(highlight)"
+locate chosen_item tree-item "$drive"
+locate above tree-item "$drive" -1
+xdotool mousemove $(middle "$above") click 3 sleep 0.5 key Escape  # Archive, just above
+locate now tree-item "$drive"
+check "another folder's menu leaves the selection on the folder shown" "$chosen_item" "$now"
+check "another folder's menu leaves the title" "$plans\\Details\\plan.dwg" "$(title "$frame")"
 settings
 keys "$dialog" alt+u Tab BackSpace Return
+until_true 10 eval '[ ! -e "$ini" ]'
 check "current layer without a command removes datains.ini" "removed" "$([ -e "$ini" ] || echo removed)"
 finish "third browse"
 
