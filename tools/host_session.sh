@@ -1,5 +1,5 @@
 # Sourced by the scripts that drive the development host: a folder world of their own on a drive
-# letter of its own ($world, shown to Windows as $drive, for example "E:"), a scratch folder for
+# letter of its own ($world, shown to Windows as $world_drive, for example "E:"), a scratch folder for
 # their own files ($work), the module's state file (beside it in $bin) kept aside and put back
 # when the script ends, and a host started in the background ($host) ended with the script.
 # The world is emptied at the start and the end: the tree then shows under $drive only what the
@@ -13,7 +13,7 @@ work=$(mktemp -d /tmp/lumvex-session.XXXXXX)
 world="$(dirname "$WINEPREFIX")/e2e-world"
 rm -rf "$world" && mkdir -p "$world"
 drive_letter "$world" || { echo "no free drive letter for $world" >&2; exit 1; }
-drive="${letter^^}:"
+world_drive="${letter^^}:"
 if [ "$drive_made" = 1 ]; then
   # Wine's services started here with their output on /dev/null, so that they hold no pipe of ours.
   wineserver -p >/dev/null 2>&1 </dev/null || true

@@ -11,6 +11,7 @@ run="$root/cmake/wine-run"
 passed=0
 failed=0
 source "$root/tools/host_session.sh"
+drive=$world_drive
 [ -n "$shots" ] && mkdir -p "$shots"
 
 check() {  # check NAME EXPECTED ACTUAL
@@ -28,7 +29,7 @@ summary() {  # summary NAME: the counts, and the exit status of the script
 }
 
 stop() {  # stop WHAT: the step that went wrong first ends the script, failed
-  failed=$((failed + 1))
+  [ "${checked_already:-}" == 1 ] || failed=$((failed + 1))
   printf 'FAILED %s: the script stops here\n' "$1"
   [ -s "$work/err" ] && { echo '--- the host said'; grep -v '^wine: ' "$work/err"; }
   summary "$(basename "$0" .sh)"
@@ -37,7 +38,7 @@ stop() {  # stop WHAT: the step that went wrong first ends the script, failed
 
 must() {  # must NAME EXPECTED ACTUAL: a check whose failure leaves nothing sound to go on with
   check "$@"
-  [ "$2" == "$3" ] || stop "$1"
+  [ "$2" == "$3" ] || checked_already=1 stop "$1"
 }
 
 until_true() {  # until_true SECONDS COMMAND...: whether COMMAND succeeds within SECONDS
