@@ -9,6 +9,8 @@ HostOptions ParseOptions(const std::vector<std::wstring> &args) {
     const bool hasValue = i + 1 < args.size();
     if (arg == L"--batch") {
       options.batch = true;
+    } else if (arg == L"--version") {
+      options.version = true;
     } else if (arg == L"--eval" && hasValue) {
       options.evals.push_back(args[++i]);
     } else if (arg == L"--module" && hasValue) {

@@ -6,6 +6,7 @@
 
 struct HostOptions {
   bool batch = false;
+  bool version = false;  // --version: print the version and end
   std::vector<std::wstring> evals;
   std::wstring modulePath;  // empty: Lumvex1.arx beside the program
   int drawings = 1;

@@ -6,6 +6,8 @@
 #include "lisp/Utf8.h"
 #include "runtime/TestApi.h"
 
+#include "LumvexVersion.h"
+
 #include <windows.h>
 #include <commctrl.h>
 #include <fcntl.h>
@@ -83,8 +85,12 @@ int main() {
   const HostOptions options = ParseOptions(CommandLineArguments());
   if (!options.error.empty()) {
     Write(stderr, L"devhost: " + options.error +
-                      L"\nusage: devhost [--batch] [--eval EXPR]... [--module PATH] [--drawings N] [--layers NAME=COLOUR;...]\n");
+                      L"\nusage: devhost [--version] [--batch] [--eval EXPR]... [--module PATH] [--drawings N] [--layers NAME=COLOUR;...]\n");
     return kExitBadOptions;
+  }
+  if (options.version) {
+    Write(stdout, L"devhost " LUMVEX_VERSION_WIDE L"\n");
+    return 0;
   }
 
   OleSession ole;
