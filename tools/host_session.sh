@@ -12,7 +12,7 @@ state="$bin/Lumvex1.ini"
 work=$(mktemp -d /tmp/lumvex-session.XXXXXX)
 world="$(dirname "$WINEPREFIX")/e2e-world"
 rm -rf "$world" && mkdir -p "$world"
-drive_letter "$world" || { echo "no free drive letter for $world" >&2; exit 1; }
+drive_letter "$world" "y x w v u t s r q p" || { echo "no free drive letter for $world" >&2; exit 1; }
 world_drive="${letter^^}:"
 if [ "$drive_made" = 1 ]; then
   # Wine's services started here with their output on /dev/null, so that they hold no pipe of ours.

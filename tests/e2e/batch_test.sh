@@ -4,12 +4,14 @@
 # Usage: batch_test.sh BIN_DIR REPO_ROOT
 source "$(dirname "$0")/common.sh" "$@"
 
-# Presses Escape in every explorer frame that opens until the process PID ends, as a person
-# cancelling each browse would.
+# Presses Escape in every titled window that the process PID or its children show, until it
+# ends, as a person cancelling each browse would. Windows are found by their process (Wine gives
+# each X window its process id), whatever their title.
+family() { local child; echo "$1"; for child in $(pgrep -P "$1"); do family "$child"; done; }
 cancel_explorers() {
-  local pid=$1 frame
+  local pid=$1 frame member
   while kill -0 "$pid" 2>/dev/null; do
-    for frame in $(xdotool search --onlyvisible --name '^ombra3$' 2>/dev/null); do
+    for frame in $(for member in $(family "$pid"); do xdotool search --onlyvisible --pid "$member" --name . 2>/dev/null; done); do
       xdotool windowactivate --sync "$frame" >/dev/null 2>&1 || xdotool windowfocus "$frame" >/dev/null 2>&1
       xdotool key --clearmodifiers Escape >/dev/null 2>&1
     done
@@ -25,6 +27,8 @@ host() {
   echo $? >"$work/rc"
 }
 alerts() { grep '^alert: ' "$work/err" || true; }
+# A state file of its own, empty: no folder or drawing remembered from another run.
+: >"$state"
 
 
 # Missing arguments, a wrong type and a well-typed call inside a list: the same run is then

@@ -31,6 +31,8 @@ summary() {  # summary NAME: the counts, and the exit status of the script
 stop() {  # stop WHAT: the step that went wrong first ends the script, failed
   [ "${checked_already:-}" == 1 ] || failed=$((failed + 1))
   printf 'FAILED %s: the script stops here\n' "$1"
+  # What a person would have seen at that moment.
+  [ -n "$shots" ] && import -window root "$shots/stopped-$(basename "$0" .sh).png" 2>/dev/null && echo "screenshot: $shots/stopped-$(basename "$0" .sh).png"
   [ -s "$work/err" ] && { echo '--- the host said'; grep -v '^wine: ' "$work/err"; }
   summary "$(basename "$0" .sh)"
   exit 1

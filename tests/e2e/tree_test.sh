@@ -21,12 +21,18 @@ keys() {  # keys WINDOW KEY...
 }
 
 choose() {  # choose KEY FOLDER: KEY in the tree until the frame shows FOLDER, or stops naming it
-  local before now
+  local before now item
   before=$(title "$frame")
-  for _ in 1 2 3; do
-    keys "$frame" "$1"
+  for attempt in 1 2 3; do
     # A key that comes while the frame takes the focus, or as a load ends, is now and then lost
-    # under a busy X server: it is pressed again only when the title has not moved at all.
+    # under a busy X server, or lands in the other pane: before it is pressed again, a click on
+    # the selected item gives the tree the keyboard. It is pressed again only when the title has
+    # not moved at all.
+    if [ $attempt -gt 1 ]; then
+      locate item tree-item "$drive"
+      xdotool mousemove $(middle "$item") click 1
+    fi
+    keys "$frame" "$1"
     now=$(named "$frame" "$2")
     [ "$now" == "$2" ] && return
     [ "$now" != "$before" ] && stop "$1 was to choose $2, but the frame shows $now"
