@@ -29,6 +29,8 @@ choose() {  # choose KEY FOLDER: KEY in the tree until the frame shows FOLDER, o
     # the selected item gives the tree the keyboard. It is pressed again only when the title has
     # not moved at all.
     if [ $attempt -gt 1 ]; then
+      echo "note: $1 did not move the frame from $before; the tree is clicked and $1 pressed again"
+      import -window root "$shots/tree-key-lost-$attempt.png" 2>/dev/null
       locate item tree-item "$drive"
       xdotool mousemove $(middle "$item") click 1
     fi
