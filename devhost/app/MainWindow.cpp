@@ -45,6 +45,10 @@ void MainWindow::Show() {
   SetFocus(m_input.Handle());
 }
 
+void MainWindow::FocusInput() {
+  if (IsWindowVisible(m_frame)) SetFocus(m_input.Handle());
+}
+
 void MainWindow::AppendHistory(const std::wstring &text) {
   if (!m_history) return;
   const std::wstring converted = WithWindowsLineEnds(text);

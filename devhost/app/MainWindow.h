@@ -20,6 +20,7 @@ class MainWindow {
   HWND DrawingView() const { return m_view; }
   void AppendHistory(const std::wstring &text);
   void Show();
+  void FocusInput();
 
  private:
   static LRESULT CALLBACK FrameProc(HWND hwnd, UINT message, WPARAM wParam, LPARAM lParam);

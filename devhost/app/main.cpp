@@ -1,6 +1,7 @@
 // devhost.exe: loads the module as the CAD application does and offers an AutoLISP command
 // line, interactive or in batch (--batch --eval EXPR ...).
 #include "app/CommandSession.h"
+#include "app/LispBridge.h"
 #include "app/MainWindow.h"
 #include "app/Options.h"
 #include "lisp/Utf8.h"
@@ -70,6 +71,7 @@ int RunInteractive(MainWindow &window, CommandSession &session, const HostOption
     session.Write(L"Command: " + expression + L"\n");
     session.Evaluate(expression);
   }
+  window.FocusInput();
   MSG message;
   while (GetMessageW(&message, nullptr, 0, 0) > 0) {
     TranslateMessage(&message);
@@ -99,17 +101,21 @@ int main() {
   devhostSetBatchMode(options.batch);
 
   MainWindow window;
-  CommandSession session([&window, &options](const std::wstring &text) {
-    // The interactive command line is echoed on standard output too, for whoever started the host.
-    Write(stdout, text);
-    if (!options.batch) window.AppendHistory(text);
-  });
+  CommandSession session(
+      [&window, &options](const std::wstring &text) {
+        // The interactive command line is echoed on standard output too, for whoever started the host.
+        Write(stdout, text);
+        if (!options.batch) window.AppendHistory(text);
+      },
+      CallModuleFunction);
   devhostSetOutputSink(ForwardPrinted, &session);
   const bool hasWindow = window.Create(
       GetModuleHandleW(nullptr),
-      [&session](const std::wstring &line) {
-        session.Write(L"Command: " + line + L"\n");
-        session.Evaluate(line);
+      [&session, &window](const std::wstring &line) {
+        session.Write((session.Waiting() ? L"(_> " : L"Command: ") + line + L"\n");
+        session.EnterLine(line);
+        // A browse hands the keyboard to the drawing view as it ends; typing goes on here.
+        window.FocusInput();
       },
       [] { devhostUnloadModule(); });
   if (hasWindow) devhostSetWindows(window.Frame(), window.DrawingView());
