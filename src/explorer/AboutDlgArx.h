@@ -1,4 +1,4 @@
-// The about box: icon and name of the module.
+// The about box: icon, name and version of the module.
 #pragma once
 
 #include "fw/Dialog.h"
