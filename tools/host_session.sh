@@ -24,6 +24,9 @@ saved=""
 host=""
 end_session() {
   if [ -n "$host" ]; then kill "$host" 2>/dev/null || true; fi
+  # Whatever else the script left running in the background (a watcher, say) ends with it.
+  local job
+  for job in $(jobs -p); do kill "$job" 2>/dev/null || true; done
   if [ -n "$saved" ]; then mv "$saved" "$state"; else rm -f "$state"; fi
   rm -rf "$work" "$world"
   mkdir -p "$world"

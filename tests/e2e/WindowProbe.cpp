@@ -172,8 +172,11 @@ int WatchLoad(HWND tree) {
   while (Answers(tree, 30))
     if (GetTickCount() - start > 20000) return Fail("no load began within 20 s");
   bool red = false;
-  do red = ShowsRed(tree) || red;
-  while (!Answers(tree, 10));
+  do {
+    if (!IsWindow(tree)) return Fail("the tree went away during its load");
+    if (GetTickCount() - start > 120000) return Fail("the load did not end within 2 minutes");
+    red = ShowsRed(tree) || red;
+  } while (!Answers(tree, 10));
   std::printf("%s\n", red ? "red" : "no red");
   return 0;
 }
