@@ -5,6 +5,7 @@
 #include "runtime/AciColors.h"
 #include "runtime/HostState.h"
 
+#include <algorithm>
 #include <cwchar>
 #include <string>
 
@@ -197,6 +198,21 @@ HWND Child(const wchar_t *cls, const wchar_t *text, DWORD style, int x, int y, i
   return child;
 }
 
+// Centred on its owner, then moved as little as it takes to lie inside the work area of the
+// owner's monitor, so that its title bar can always be reached.
+POINT PlaceNear(HWND owner, int width, int height) {
+  RECT ownerRect{0, 0, GetSystemMetrics(SM_CXSCREEN), GetSystemMetrics(SM_CYSCREEN)};
+  if (owner) GetWindowRect(owner, &ownerRect);
+  MONITORINFO monitor{};
+  monitor.cbSize = sizeof monitor;
+  RECT work = ownerRect;
+  if (GetMonitorInfoW(MonitorFromRect(&ownerRect, MONITOR_DEFAULTTONEAREST), &monitor)) work = monitor.rcWork;
+  POINT at{(ownerRect.left + ownerRect.right - width) / 2, (ownerRect.top + ownerRect.bottom - height) / 2};
+  at.x = std::max(work.left, std::min(at.x, work.right - static_cast<LONG>(width)));
+  at.y = std::max(work.top, std::min(at.y, work.bottom - static_cast<LONG>(height)));
+  return at;
+}
+
 bool RunColorDialog(int &color) {
   HINSTANCE instance = GetModuleHandleW(nullptr);
   RegisterClasses(instance);
@@ -206,12 +222,10 @@ bool RunColorDialog(int &color) {
   const DWORD style = WS_POPUP | WS_CAPTION | WS_SYSMENU | DS_MODALFRAME;
   RECT frame{0, 0, kGridWidth, kGridHeight + 70};
   AdjustWindowRectEx(&frame, style, FALSE, WS_EX_DLGMODALFRAME | WS_EX_CONTROLPARENT);
-  RECT ownerRect{0, 0, GetSystemMetrics(SM_CXSCREEN), GetSystemMetrics(SM_CYSCREEN)};
-  if (owner) GetWindowRect(owner, &ownerRect);
   const int width = frame.right - frame.left, height = frame.bottom - frame.top;
-  const int x = (ownerRect.left + ownerRect.right - width) / 2, y = (ownerRect.top + ownerRect.bottom - height) / 2;
-  state.dialog = CreateWindowExW(WS_EX_DLGMODALFRAME | WS_EX_CONTROLPARENT, kDialogClass, L"Select Color", style, x, y, width,
-                                 height, owner, nullptr, instance, &state);
+  const POINT at = PlaceNear(owner, width, height);
+  state.dialog = CreateWindowExW(WS_EX_DLGMODALFRAME | WS_EX_CONTROLPARENT, kDialogClass, L"Select Color", style, at.x, at.y,
+                                 width, height, owner, nullptr, instance, &state);
   if (!state.dialog) return false;
   state.grid = Child(kGridClass, nullptr, 0, 0, 0, kGridWidth, kGridHeight, state.dialog, 0, &state);
   const int row = kGridHeight + 8;
