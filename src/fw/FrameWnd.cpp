@@ -112,6 +112,12 @@ void CFrameWnd::ShowControlBar(CControlBar *bar, BOOL show) {
   RecalcLayout();
 }
 
+namespace {
+// A bar squeezed out of the frame and given room again repaints nothing by itself, nor do the
+// windows it holds (labels, captions, the search box): all of it is painted anew.
+void RepaintWhole(HWND bar) { RedrawWindow(bar, nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_ALLCHILDREN); }
+}  // namespace
+
 void CFrameWnd::RecalcLayout() {
   if (!m_hWnd) return;
   RECT client;
@@ -137,6 +143,8 @@ void CFrameWnd::RecalcLayout() {
     if (!((*bar).GetBarStyle() & CBRS_ALIGN_BOTTOM)) place(bar, false);
   if (HWND pane = ::GetDlgItem(m_hWnd, AFX_IDW_PANE_FIRST))
     ::MoveWindow(pane, client.left, top, width, std::max(0, bottom - top), TRUE);
+  for (CControlBar *bar : m_dockedBars)
+    if (bar->m_hWnd) RepaintWhole(bar->m_hWnd);
 }
 
 void CFrameWnd::SetMessageText(const std::string &text) {
