@@ -19,6 +19,9 @@
 
 #include <commctrl.h>
 
+#include "../win/ScreenPixels.h"
+
+#include <algorithm>
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
@@ -140,26 +143,8 @@ bool Answers(HWND window, UINT milliseconds) {
 }
 
 bool ShowsRed(HWND tree) {
-  const RECT rect = ScreenRect(tree);
-  const int width = rect.right - rect.left, height = rect.bottom - rect.top;
-  BITMAPINFO info{};
-  info.bmiHeader = {sizeof info.bmiHeader, width, -height, 1, 32, BI_RGB, 0, 0, 0, 0, 0};
-  void *bits = nullptr;
-  HDC screen = GetDC(nullptr);
-  HDC memory = CreateCompatibleDC(screen);
-  HBITMAP picture = CreateDIBSection(screen, &info, DIB_RGB_COLORS, &bits, nullptr, 0);
-  bool red = false;
-  if (memory && picture) {
-    HGDIOBJ old = SelectObject(memory, picture);
-    BitBlt(memory, 0, 0, width, height, screen, rect.left, rect.top, SRCCOPY);
-    SelectObject(memory, old);
-    const auto *pixels = static_cast<const DWORD *>(bits);
-    for (int i = 0; i < width * height && !red; ++i) red = (pixels[i] & 0xFFFFFF) == 0xFF0000;
-  }
-  if (picture) DeleteObject(picture);
-  if (memory) DeleteDC(memory);
-  ReleaseDC(nullptr, screen);
-  return red;
+  const std::vector<DWORD> pixels = ScreenPixels(ScreenRect(tree));
+  return std::find(pixels.begin(), pixels.end(), 0xFF0000u) != pixels.end();
 }
 
 // The tree's thread answers no message while it fills an item: the load runs from the first

@@ -1,6 +1,7 @@
 // The bottom bar shows its captions whatever the frame's size went through: squeezed out of the
 // frame by its size grip and given room again, it is painted anew, read back from the screen.
 #include "ExplorerHarness.h"
+#include "ScreenPixels.h"
 #include "res/resource.h"
 
 #include <gtest/gtest.h>
@@ -11,25 +12,8 @@ namespace {
 int InkOn(HWND window) {
   RECT rect{};
   GetWindowRect(window, &rect);
-  const int width = rect.right - rect.left, height = rect.bottom - rect.top;
-  if (width <= 0 || height <= 0) return 0;
-  BITMAPINFO info{};
-  info.bmiHeader = {sizeof info.bmiHeader, width, -height, 1, 32, BI_RGB, 0, 0, 0, 0, 0};
-  void *bits = nullptr;
-  HDC screen = GetDC(nullptr);
-  HDC memory = CreateCompatibleDC(screen);
-  HBITMAP picture = CreateDIBSection(screen, &info, DIB_RGB_COLORS, &bits, nullptr, 0);
   int ink = 0;
-  if (memory && picture) {
-    HGDIOBJ old = SelectObject(memory, picture);
-    BitBlt(memory, 0, 0, width, height, screen, rect.left, rect.top, SRCCOPY);
-    SelectObject(memory, old);
-    const auto *pixels = static_cast<const BYTE *>(bits);
-    for (int i = 0; i < width * height; ++i) ink += pixels[4 * i] + pixels[4 * i + 1] + pixels[4 * i + 2] < 200;
-  }
-  if (picture) DeleteObject(picture);
-  if (memory) DeleteDC(memory);
-  ReleaseDC(nullptr, screen);
+  for (DWORD pixel : ScreenPixels(rect)) ink += (pixel & 0xFF) + (pixel >> 8 & 0xFF) + (pixel >> 16) < 200;
   return ink;
 }
 
