@@ -2,7 +2,6 @@
 
 #include "fw/WinApp.h"
 #include "res/resource.h"
-#include "thumbs/Ombra3View.h"
 
 namespace {
 constexpr UINT kTickMilliseconds = 125;
@@ -17,10 +16,6 @@ CChildView::CChildView() {
 
 BOOL CChildView::PreTranslateMessage(MSG *msg) {
   if (msg->message == WM_KEYDOWN && msg->hwnd == m_hWnd) {
-    if (msg->wParam == VK_TAB) {
-      if (g_pThumbView) g_pThumbView->SetFocus();
-      return TRUE;
-    }
     if (msg->wParam == VK_ESCAPE) {
       if (fw::CWinApp *app = fw::AfxGetApp(); app && app->m_pMainWnd) app->m_pMainWnd->PostMessage(WM_APP, 2);
       return TRUE;

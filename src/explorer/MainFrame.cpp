@@ -2,6 +2,7 @@
 
 #include "catalogue/Ombra3Doc.h"
 #include "explorer/AboutDlgArx.h"
+#include "explorer/FocusRing.h"
 #include "explorer/LeftView.h"
 #include "fw/CmdUI.h"
 #include "fw/WinApp.h"
@@ -160,6 +161,11 @@ void CMainFrame::OnDestroy() {
 void CMainFrame::EndBrowse(int code) const {
   fw::CWinApp *app = fw::AfxGetApp();
   if (app && app->m_pMainWnd) app->m_pMainWnd->PostMessage(WM_APP, static_cast<WPARAM>(code));
+}
+
+BOOL CMainFrame::PreTranslateMessage(MSG *msg) {
+  if (HandleFocusKey(*this, *msg)) return TRUE;
+  return CFrameWnd::PreTranslateMessage(msg);
 }
 
 void CMainFrame::EnableAccept(bool enable) {

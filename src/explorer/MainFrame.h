@@ -37,6 +37,7 @@ class CMainFrame : public fw::CFrameWnd {
   BOOL OnCreateClient(CREATESTRUCTA *cs) override;
   void OnDestroy() override;
   BOOL OnFrameCommand(UINT id, int code, fw::CCmdUI *cmdUI) override;
+  BOOL PreTranslateMessage(MSG *msg) override;
 
  private:
   bool CreateTopBar();

@@ -2,6 +2,7 @@
 
 #include "catalogue/DwgData.h"
 #include "catalogue/Ombra3Doc.h"
+#include "explorer/Handles.h"
 #include "explorer/LeftView.h"
 #include "explorer/MainFrame.h"
 #include "filecmd/ForFileCommands.h"
@@ -80,6 +81,7 @@ void exCDwgThumbnail::Click() {
   Record().Select();
   ShowChosen(true);
   if (g_pMainFrame) g_pMainFrame->EnableAccept(true);
+  if (g_pThumbView) g_pThumbView->SetKeyRecord(m_nIndex);
   ::RedrawWindow(m_hWnd, nullptr, nullptr, kRedrawAll);
 }
 
@@ -127,12 +129,7 @@ void exCDwgThumbnail::RunMenuCommand(UINT command) {
       if (g_pThumbView && command == ID_TILE_PASTE) g_pThumbView->PasteFiles();
       if (g_pLeftView) g_pLeftView->RefreshSelectedFolder();
       return;
-    case ID_TILE_RENAME:
-      m_editCaption.SetFocus();
-      m_editCaption.Redraw();
-      m_editCaption.SetReadOnly(FALSE);
-      m_editCaption.StartEditing();
-      return;
+    case ID_TILE_RENAME: StartRename(); return;
     case ID_SORT_BY_NAME:
     case ID_SORT_BY_DATE:
     case ID_SORT_BY_SIZE:
@@ -141,6 +138,13 @@ void exCDwgThumbnail::RunMenuCommand(UINT command) {
     case ID_TILE_PROPERTY: ShowProperties(); return;
     default: return;
   }
+}
+
+void exCDwgThumbnail::StartRename() {
+  m_editCaption.SetFocus();
+  m_editCaption.Redraw();
+  m_editCaption.SetReadOnly(FALSE);
+  m_editCaption.StartEditing();
 }
 
 void exCDwgThumbnail::ShowProperties() const {
@@ -193,5 +197,12 @@ LRESULT exCDwgThumbnail::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) 
   const uint32_t background = 0;
   acdbDisplayPreviewFromDwg(ToWide(m_strFileName.c_str()).c_str(), m_hWnd, &background);
   ::EndPaint(m_hWnd, &paint);
+  // The tile the keyboard is on shows a focus frame over its picture.
+  if (g_pThumbView && g_pThumbView->KeyRecord() == m_nIndex) {
+    RECT frame;
+    GetClientRect(&frame);
+    ::InflateRect(&frame, -2, -2);
+    ::DrawFocusRect(ClientDeviceContext(m_hWnd).Get(), &frame);
+  }
   return 0;
 }

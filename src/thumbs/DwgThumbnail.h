@@ -29,6 +29,13 @@ class exCDwgThumbnail : public CDwgThumbnail {
   BOOL PreTranslateMessage(MSG *msg) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
+  // What a plain click does: the drawing alone marked and chosen.
+  void Click();
+  // What a double click does: the drawing accepted.
+  void Accept() const;
+  // The caption box opened for a new name, as the tile menu's Rename does.
+  void StartRename();
+
   CEditEx m_editCaption;
   int m_nIndex = 0;
   CTileTool m_toolTip;
@@ -36,9 +43,7 @@ class exCDwgThumbnail : public CDwgThumbnail {
  private:
   DwgData &Record() const;
   void ShowChosen(bool chosen) const;
-  void Click();
   void ControlClick();
-  void Accept() const;
   // Delete and Paste rebuild every tile, this one among them: nothing may touch the tile after.
   void RunMenuCommand(UINT command);
   UINT TrackMenu(POINT screen) const;

@@ -11,6 +11,7 @@
 #include "fw/Menu.h"
 #include "fw/WinApp.h"
 #include "res/resource.h"
+#include "thumbs/FocusedEdit.h"
 #include "thumbs/RingLayout.h"
 
 #include <windowsx.h>
@@ -175,6 +176,7 @@ void COmbra3View::Relayout(BOOL fitFrame) {
 
 void COmbra3View::ResetAndBuild(BOOL sort) {
   if (!m_hWnd) return;
+  if (sort) m_nKeyRecord = -1;  // the records move: the keyboard starts again
   RECT client;
   GetClientRect(&client);
   m_nColumns = ColumnsThatFit(client.right, m_nGap, ColStep());
@@ -294,32 +296,84 @@ BOOL COmbra3View::OnScroll(UINT scrollCode, UINT pos, BOOL doScroll) {
 }
 
 void COmbra3View::OnKey(WPARAM key) {
+  const int page = m_nVisibleRows * m_nColumns;
+  // Before any mark, the first arrow marks the first tile in view.
+  const bool marked = m_nKeyRecord >= 0 && m_nKeyRecord < m_nRecordCount;
+  const int current = marked ? m_nKeyRecord : m_nTopRow * m_nColumns;
   switch (key) {
-    case VK_TAB:
-      if (g_pLeftView) g_pLeftView->SetFocus();
-      break;
     case VK_PRIOR:
       m_nTopRow = m_nTopRow > m_nVisibleRows ? m_nTopRow - m_nVisibleRows : 0;
       RebuildAtTopRow();
+      MoveKeyMark(std::max(0, current - page));
       break;
     case VK_NEXT:
       m_nTopRow += m_nVisibleRows;
       if (m_nTopRow + m_nVisibleRows > m_nTotalRows) m_nTopRow = m_nTotalRows - m_nVisibleRows;
       RebuildAtTopRow();
+      MoveKeyMark(std::min(m_nRecordCount - 1, current + page));
       break;
     case VK_END:
       m_nTopRow = m_nTotalRows - m_nVisibleRows;
       RebuildAtTopRow();
+      MoveKeyMark(m_nRecordCount - 1);
       break;
-    case VK_HOME: ResetAndBuild(FALSE); break;
-    case VK_UP: OnScroll(0x00FF, 0, TRUE); break;
-    case VK_DOWN: OnScroll(0x01FF, 0, TRUE); break;
+    case VK_HOME:
+      ResetAndBuild(FALSE);
+      MoveKeyMark(0);
+      break;
+    case VK_LEFT: MoveKeyMark(marked ? std::max(0, current - 1) : current); break;
+    case VK_RIGHT: MoveKeyMark(marked ? std::min(m_nRecordCount - 1, current + 1) : current); break;
+    case VK_UP: MoveKeyMark(marked && current >= m_nColumns ? current - m_nColumns : current); break;
+    case VK_DOWN:
+      MoveKeyMark(marked && current + m_nColumns < m_nRecordCount ? current + m_nColumns : current);
+      break;
+    case VK_RETURN:
+      if (exCDwgThumbnail *tile = marked ? TileOf(m_nKeyRecord) : nullptr) tile->Accept();
+      break;
+    case VK_F2:
+      if (exCDwgThumbnail *tile = marked ? TileOf(m_nKeyRecord) : nullptr) tile->StartRename();
+      break;
     default: break;
   }
 }
 
+exCDwgThumbnail *COmbra3View::TileOf(int record) const {
+  if (record < 0) return nullptr;
+  for (int i = 0; i < m_nRingSize; ++i)
+    if (m_tiles[i].m_hWnd && m_tiles[i].m_nIndex == record) return &m_tiles[i];
+  return nullptr;
+}
+
+void COmbra3View::SetKeyRecord(int record) {
+  if (record == m_nKeyRecord) return;
+  const int previous = m_nKeyRecord;
+  m_nKeyRecord = record;
+  for (int shown : {previous, record})
+    if (exCDwgThumbnail *tile = TileOf(shown)) ::InvalidateRect(tile->m_hWnd, nullptr, TRUE);
+}
+
+void COmbra3View::MoveKeyMark(int record) {
+  if (m_nRecordCount == 0 || m_nColumns == 0 || record < 0 || record >= m_nRecordCount) return;
+  const int row = record / m_nColumns;
+  // A row next to those in view comes with a line step, as the wheel brings it; a row further
+  // away has the ring built there, as the page keys do.
+  if (row == m_nTopRow - 1) {
+    OnScroll(0x00FF, 0, TRUE);
+  } else if (row == m_nTopRow + m_nVisibleRows) {
+    OnScroll(0x01FF, 0, TRUE);
+  } else if (row < m_nTopRow || row >= m_nTopRow + m_nVisibleRows) {
+    m_nTopRow = std::max(0, std::min(row, m_nTotalRows - m_nVisibleRows));
+    RebuildAtTopRow();
+  }
+  if (exCDwgThumbnail *tile = TileOf(record)) tile->Click();
+  SetKeyRecord(record);
+}
+
 BOOL COmbra3View::PreTranslateMessage(MSG *msg) {
-  if (msg->message == WM_KEYDOWN && m_hWnd && (msg->hwnd == m_hWnd || ::IsChild(m_hWnd, msg->hwnd))) OnKey(msg->wParam);
+  // The keys of a caption box being renamed are the box's own.
+  const bool renaming = g_pFocusedEdit && !(::GetWindowLongA(g_pFocusedEdit->m_hWnd, GWL_STYLE) & ES_READONLY);
+  if (msg->message == WM_KEYDOWN && m_hWnd && !renaming && (msg->hwnd == m_hWnd || ::IsChild(m_hWnd, msg->hwnd)))
+    OnKey(msg->wParam);
   return CScrollView::PreTranslateMessage(msg);
 }
 

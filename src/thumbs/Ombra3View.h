@@ -32,6 +32,10 @@ class COmbra3View : public fw::CScrollView {
   // whose window and object the rescan destroys).
   void PostRefreshFolder() const;
   HWND ToolTipWindow() const { return m_toolTip.m_hWnd; }
+  // The record the keyboard is on, whose tile shows a focus frame; -1 before any. A click puts
+  // it on the tile clicked.
+  int KeyRecord() const { return m_nKeyRecord; }
+  void SetKeyRecord(int record);
 
   BOOL PreCreateWindow(CREATESTRUCTA &cs) override;
   BOOL PreTranslateMessage(MSG *msg) override;
@@ -69,6 +73,9 @@ class COmbra3View : public fw::CScrollView {
   BOOL LineDown(int x, int y, int totalHeight);
   BOOL LineUp(int x, int y, int totalHeight);
   void OnKey(WPARAM key);
+  // Moves the keyboard to the record, scrolling it into view, and chooses it as a click does.
+  void MoveKeyMark(int record);
+  exCDwgThumbnail *TileOf(int record) const;
   void OnMouseWheel(short delta);
   void OnBackgroundMenu(LPARAM point);
   void OnPaint();
@@ -81,6 +88,7 @@ class COmbra3View : public fw::CScrollView {
   int m_nWheelDelta = 0;
   bool m_bBuilding = false;
   bool m_bSizePending = false;
+  int m_nKeyRecord = -1;
 };
 
 // The thumbnail view while the explorer is open, or null.
