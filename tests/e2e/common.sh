@@ -69,12 +69,6 @@ window() {  # window VARIABLE TITLE-REGEX: sets VARIABLE to the visible window s
   printf -v "$1" '%s' "$now"
 }
 
-geometry() {  # geometry WINDOW: sets X Y WIDTH HEIGHT, or stops
-  local shell
-  shell=$(xdotool getwindowgeometry --shell "$1" 2>/dev/null) || stop "reading the place of window $1"
-  eval "$shell"
-}
-
 placed() {  # placed WINDOW WIDTH HEIGHT: sets X Y WIDTH HEIGHT once the window has that size, or stops
   sized() { eval "$(xdotool getwindowgeometry --shell "$1" 2>/dev/null)"; [ "${WIDTH:-0}x${HEIGHT:-0}" == "$2x$3" ]; }
   until_true 20 sized "$@" || stop "waiting for window $1 to take its remembered size $2x$3 (it is ${WIDTH}x${HEIGHT})"
