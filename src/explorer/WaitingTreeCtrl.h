@@ -68,7 +68,8 @@ class CWaitingTreeCtrl : public fw::CTreeCtrl {
   std::atomic<int> m_nDone{0};
   std::atomic<int> m_nTotal{0};
   HTREEITEM m_hPlaceholder = nullptr;
-  HTREEITEM m_hPending = nullptr;
+  HTREEITEM m_hPending = nullptr;  // the item prepared for a load, until the load starts
+  bool m_bLoading = false;         // a load runs: its thread and drawing objects are in use
   int m_nPendingButton = 0;  // the pending item's children button before the load
   HTREEITEM m_hStartItem = nullptr;
 

@@ -1,6 +1,6 @@
 // The loading protocol on a real tree control: the placeholder, the animation thread with its
-// tick and progress steps, the join before the children show, the children button, and no
-// second load of an item that has children.
+// tick and progress steps, the join before the children show, the children button, no second
+// load of an item that has children, and no load beside a running one or without its placeholder.
 #include "explorer/HourglassFX.h"
 #include "explorer/ProgressFX.h"
 #include "explorer/WaitingTreeCtrl.h"
@@ -8,6 +8,7 @@
 #include <gtest/gtest.h>
 
 #include <cstring>
+#include <functional>
 #include <vector>
 
 namespace {
@@ -15,14 +16,20 @@ class RecordingTree : public CWaitingTreeCtrl {
  public:
   int children = 0;
   bool fillResult = true;
+  bool refusePlaceholder = false;
+  bool redrawOn = true;
+  std::function<void()> duringFill;
   int fills = 0, waitBegins = 0, placeholders = 0;
   bool placeholderGoneDuringFill = false, threadEndedAtShow = false, handlesClosedAtShow = false;
   RECT placeholderText{};
   DWORD animationThread = 0;
 
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override {
-    if (message == TVM_INSERTITEMA && std::strcmp(reinterpret_cast<TVINSERTSTRUCTA *>(lParam)->item.pszText, "Loading...") == 0)
+    if (message == TVM_INSERTITEMA && std::strcmp(reinterpret_cast<TVINSERTSTRUCTA *>(lParam)->item.pszText, "Loading...") == 0) {
+      if (refusePlaceholder) return 0;
       ++placeholders;
+    }
+    if (message == WM_SETREDRAW) redrawOn = wParam != 0;
     if (message == WM_SETREDRAW && wParam && animationThread) {
       HANDLE thread = OpenThread(SYNCHRONIZE, FALSE, animationThread);
       threadEndedAtShow = !thread || WaitForSingleObject(thread, 0) == WAIT_OBJECT_0;
@@ -41,6 +48,7 @@ class RecordingTree : public CWaitingTreeCtrl {
   bool FillItemChildren(HTREEITEM item) override {
     ++fills;
     placeholderGoneDuringFill = GetChildItem(item) == nullptr;
+    if (duringFill) duringFill();
     SetProgress(0, 0);
     for (int i = 0; i < children; ++i, Sleep(60)) {
       InsertItem("child", item);
@@ -89,6 +97,13 @@ class WaitingTree : public ::testing::Test {
     m_tree.GetItem(&query);
     return query.cChildren;
   }
+  int ItemCount(HTREEITEM parent = TVI_ROOT) const {
+    int count = 0;
+    for (HTREEITEM child = m_tree.GetChildItem(parent); child; child = m_tree.GetNextSiblingItem(child))
+      count += 1 + ItemCount(child);
+    return count;
+  }
+  bool Expanded(HTREEITEM item) const { return m_tree.GetItemState(item, TVIS_EXPANDED) & TVIS_EXPANDED; }
   void Notify(UINT code, HTREEITEM item) const {
     NMTREEVIEWA notice{};
     notice.hdr = NMHDR{m_tree.m_hWnd, 1, code};
@@ -156,5 +171,62 @@ TEST_F(WaitingTree, ChildrenButtonFollowsTheFillAndASecondExpansionLoadsNothing)
   m_tree.Expand(kept, TVE_EXPAND);
   EXPECT_EQ(ChildrenButton(kept), 1);
   EXPECT_EQ(m_tree.GetItemState(kept, TVIS_EXPANDED) & TVIS_EXPANDED, 0u);
+}
+
+// Loads start only from a prepared expansion, one at a time: numpad "*" expands nothing, an
+// expansion asked for while a load runs (the shell pumps messages) is refused, and neither a
+// stray expanded notification nor a refused placeholder deletes the tree or leaves it frozen.
+TEST_F(WaitingTree, NoLoadBesideARunningOneOrWithoutItsPlaceholder) {
+  struct Case {
+    const char *name;
+    std::function<void(Tree &tree, HTREEITEM folder, HTREEITEM other)> act;
+    int fills;
+    bool folderExpanded, otherExpanded;
+  } cases[] = {
+      {"numpad * on the selected folder",
+       [](Tree &tree, HTREEITEM folder, HTREEITEM) {
+         tree.SelectItem(folder);
+         tree.SendMessage(WM_KEYDOWN, VK_MULTIPLY, 0);
+       },
+       0, false, false},
+      {"the other folder expanded while the folder loads",
+       [](Tree &tree, HTREEITEM folder, HTREEITEM other) {
+         tree.duringFill = [&tree, other] { tree.Expand(other, TVE_EXPAND); };
+         tree.Expand(folder, TVE_EXPAND);
+       },
+       1, true, false},
+      {"an expanded notification with no expanding one before it",
+       [this](Tree &tree, HTREEITEM folder, HTREEITEM other) {
+         tree.Expand(folder, TVE_EXPAND);
+         Notify(TVN_ITEMEXPANDEDA, other);
+       },
+       1, true, false},
+      {"the placeholder cannot be inserted",
+       [](Tree &tree, HTREEITEM folder, HTREEITEM) {
+         tree.refusePlaceholder = true;
+         tree.Expand(folder, TVE_EXPAND);
+       },
+       0, false, false},
+  };
+  for (const Case &c : cases) {
+    SCOPED_TRACE(c.name);
+    m_tree.DeleteAllItems();
+    m_tree.fills = 0;
+    m_tree.children = 2;
+    m_tree.refusePlaceholder = false;
+    m_tree.duringFill = nullptr;
+    HTREEITEM folder = Folder("folder"), other = Folder("other");
+    const int before = ItemCount();
+    c.act(m_tree, folder, other);
+    EXPECT_EQ(m_tree.fills, c.fills);
+    EXPECT_EQ(ItemCount(), before + 2 * c.fills);
+    EXPECT_EQ(Expanded(folder), c.folderExpanded);
+    EXPECT_EQ(Expanded(other), c.otherExpanded);
+    EXPECT_TRUE(m_tree.redrawOn);
+    m_tree.duringFill = nullptr;
+    m_tree.refusePlaceholder = false;
+    m_tree.Expand(other, TVE_EXPAND);
+    EXPECT_TRUE(Expanded(other)) << "the next expansion loads";
+  }
 }
 }  // namespace
