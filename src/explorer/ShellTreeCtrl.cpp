@@ -4,6 +4,7 @@
 #include "explorer/MainFrame.h"
 #include "explorer/ShellString.h"
 #include "fw/Menu.h"
+#include "host/HostApi.h"
 #include "settings/DialogSetLa.h"
 #include "thumbs/Ombra3View.h"
 
@@ -259,7 +260,10 @@ void CShellTreeCtrl::RunFolderSettingsMenu(HTREEITEM item) {
   const UINT chosen = menu.TrackPopupMenu(TPM_RETURNCMD | TPM_RIGHTBUTTON | TPM_NONOTIFY, corner.x, corner.y, m_hWnd);
   if (chosen == kFolderSettingsCommand) {
     CDialogSetLa dialog(this);
-    if (dialog.SetFolder(path)) dialog.DoModal();
+    if (dialog.SetFolder(path))
+      dialog.DoModal();
+    else
+      acedAlert(L"The folder's path is too long for its settings file");
     SetFocus();
   }
 }

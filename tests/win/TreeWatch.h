@@ -52,8 +52,9 @@ inline HTREEITEM ChildNamed(HWND tree, HTREEITEM parent, const std::string &text
   return nullptr;
 }
 
-// Right-clicks the selected folder and chooses "&Folder settings"; the dialog, or null.
-inline HWND OpenFolderSettings(HWND tree) {
+// Right-clicks the selected folder and chooses "&Folder settings"; returns once the menu has
+// closed and its handler has run up to its dialog, if it opens one. False when no menu showed.
+inline bool ChooseFolderSettings(HWND tree) {
   RECT rect{};
   const HTREEITEM caret = TreeNext(tree, nullptr, TVGN_CARET);
   std::memcpy(&rect, &caret, sizeof caret);  // TVM_GETITEMRECT takes the item in the rectangle
@@ -65,7 +66,13 @@ inline HWND OpenFolderSettings(HWND tree) {
   PostMessageA(tree, WM_RBUTTONDOWN, MK_RBUTTON, at);
   PostMessageA(tree, WM_RBUTTONUP, 0, at);
   HWND menu = WaitForWindow("#32768", nullptr, 5000);
-  if (!menu) return nullptr;
+  if (!menu) return false;
   PostMessageA(menu, WM_CHAR, 'f', 0);
-  return WaitForWindow("#32770", "Folder settings", 5000);
+  for (int i = 0; i < 250 && IsWindowVisible(menu); ++i) Sleep(20);
+  return true;
+}
+
+// The folder settings dialog opened from the tree's menu, or null.
+inline HWND OpenFolderSettings(HWND tree) {
+  return ChooseFolderSettings(tree) ? WaitForWindow("#32770", "Folder settings", 5000) : nullptr;
 }
