@@ -3,6 +3,7 @@
 #include "catalogue/Ombra3Doc.h"
 #include "fw/FrameworkIds.h"
 #include "host/ModuleGlobals.h"
+#include "host/SplitPath.h"
 
 CLeftView *g_pLeftView = nullptr;
 
@@ -22,8 +23,16 @@ BOOL CLeftView::Create(LPCSTR className, LPCSTR windowName, DWORD style, const R
   if (!m_wndTree.Create(kTreeStyle, RECT{0, 0, 0, 0}, this, AFX_IDW_PANE_FIRST)) return FALSE;
   m_wndTree.InsertRootItem();
   if (g_pDoc) {
-    if (g_szStartShellPath[0]) g_pDoc->m_strShellPath = g_szStartShellPath;
+    // The folder itself, for where the walk along labels stops short: the start folder's
+    // drive and directory, or the folder shown last.
+    std::string folder = g_pDoc->m_strPath;
+    if (g_szStartFolder[0]) {
+      const PathParts start = SplitPath(g_szStartFolder);
+      folder = start.drive + start.directory;
+      g_pDoc->m_strShellPath = g_szStartShellPath;
+    }
     m_wndTree.ExpandToPath(g_pDoc->m_strShellPath);
+    if (!m_wndTree.GetStartItem()) m_wndTree.ExpandToFolder(folder);
   }
   return created;
 }

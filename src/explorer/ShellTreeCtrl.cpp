@@ -5,6 +5,7 @@
 #include "explorer/ShellString.h"
 #include "fw/Menu.h"
 #include "host/HostApi.h"
+#include "host/TextConvert.h"
 #include "settings/DialogSetLa.h"
 #include "thumbs/Ombra3View.h"
 
@@ -48,6 +49,12 @@ int CALLBACK CompareItems(LPARAM first, LPARAM second, LPARAM) {
 
 bool FolderPath(const ShellItemData *data, char (&path)[MAX_PATH]) {
   return data && SHGetPathFromIDListA(data->pidl.Get(), path);
+}
+
+// Whether two absolute lists name the same object, as the Desktop compares them.
+bool SameIds(IShellFolder *desktop, LPCITEMIDLIST first, LPCITEMIDLIST second) {
+  const HRESULT hr = desktop ? desktop->CompareIDs(0, first, second) : E_FAIL;
+  return SUCCEEDED(hr) && static_cast<short>(HRESULT_CODE(hr)) == 0;
 }
 }  // namespace
 
@@ -132,14 +139,19 @@ void CShellTreeCtrl::FillItemDisplay(TVITEMA &item, const ShellItemData &data) c
   }
 }
 
-bool CShellTreeCtrl::FillChildren(HTREEITEM parent, LPCITEMIDLIST parentPidl, UINT flags) {
+IShellFolder *CShellTreeCtrl::BindFolder(LPCITEMIDLIST absolute) const {
   IShellFolder *folder = nullptr;
-  if (pidl::Size(parentPidl) == 0) {
+  if (pidl::Size(absolute) == 0) {
     folder = m_desktop.Get();
     if (folder) folder->AddRef();
   } else if (m_desktop.Get()) {
-    m_desktop.Get()->BindToObject(parentPidl, nullptr, IID_IShellFolder, reinterpret_cast<void **>(&folder));
+    m_desktop.Get()->BindToObject(absolute, nullptr, IID_IShellFolder, reinterpret_cast<void **>(&folder));
   }
+  return folder;
+}
+
+bool CShellTreeCtrl::FillChildren(HTREEITEM parent, LPCITEMIDLIST parentPidl, UINT flags) {
+  IShellFolder *folder = BindFolder(parentPidl);
   if (!folder) return false;
 
   SHCONTF listing = SHCONTF_FOLDERS;
@@ -171,6 +183,46 @@ int CShellTreeCtrl::CompareSiblings(const ShellItemData &first, const ShellItemD
   if (FAILED(hr)) return 0;
   const short order = static_cast<short>(HRESULT_CODE(hr));
   return order < 0 ? -1 : order > 0 ? 1 : 0;
+}
+
+bool CShellTreeCtrl::ExpandToFolder(const std::string &folder) {
+  IShellFolder *desktop = m_desktop.Get();
+  std::wstring name = ToWide(folder.c_str());
+  LPITEMIDLIST parsed = nullptr;
+  if (!desktop || folder.empty() ||
+      FAILED(desktop->ParseDisplayName(m_hWnd, nullptr, name.data(), nullptr, &parsed, nullptr)) || !parsed)
+    return false;
+  const CShellPidl target(parsed);
+  const UINT depth = pidl::Count(target.Get());
+  // The root is the Desktop, whose list is empty: every parsed folder lies below it.
+  HTREEITEM item = GetRootItem();
+  for (UINT level = 0; item && level < depth; ++level) {
+    Expand(item, TVE_EXPAND);
+    item = ChildToward(item, target.Get(), level);
+  }
+  if (!item) return false;
+  Expand(item, TVE_EXPAND);
+  m_hStartItem = item;
+  return true;
+}
+
+// The child of `item` (whose list has `level` items) on the way to `target`: the listed child
+// with the same ids as the target's first level + 1 items, or else that item of the target
+// added as a child, as a folder the tree does not list (a hidden one) is.
+HTREEITEM CShellTreeCtrl::ChildToward(HTREEITEM item, LPCITEMIDLIST target, UINT level) {
+  const auto *parent = reinterpret_cast<const ShellItemData *>(GetItemData(item));
+  const CShellPidl way(pidl::Head(target, level + 1));
+  if (!parent || !way.Get()) return nullptr;
+  for (HTREEITEM child = GetChildItem(item); child; child = GetNextSiblingItem(child)) {
+    const auto *data = reinterpret_cast<const ShellItemData *>(GetItemData(child));
+    if (data && SameIds(m_desktop.Get(), data->pidl.Get(), way.Get())) return child;
+  }
+  IShellFolder *folder = BindFolder(parent->pidl.Get());
+  if (!folder) return nullptr;
+  const CShellPidl id(pidl::Head(pidl::At(target, level), 1));
+  HTREEITEM added = id.Get() ? InsertShellItem(item, folder, parent->pidl.Get(), id.Get(), parent->nFlags & kInheritedFlags) : nullptr;
+  folder->Release();
+  return added;
 }
 
 bool CShellTreeCtrl::FillItemChildren(HTREEITEM item) {
