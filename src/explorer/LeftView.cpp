@@ -3,7 +3,7 @@
 #include "catalogue/Ombra3Doc.h"
 #include "fw/FrameworkIds.h"
 #include "host/ModuleGlobals.h"
-#include "host/SplitPath.h"
+#include "host/TextConvert.h"
 
 CLeftView *g_pLeftView = nullptr;
 
@@ -27,7 +27,7 @@ BOOL CLeftView::Create(LPCSTR className, LPCSTR windowName, DWORD style, const R
     // drive and directory, or the folder shown last.
     std::string folder = g_pDoc->m_strPath;
     if (g_szStartFolder[0]) {
-      const PathParts start = SplitPath(g_szStartFolder);
+      const PathParts start = SplitAnsiPath(g_szStartFolder);
       folder = start.drive + start.directory;
       g_pDoc->m_strShellPath = g_szStartShellPath;
     }

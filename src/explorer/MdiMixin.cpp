@@ -7,7 +7,7 @@
 #include "fw/Dialog.h"
 #include "fw/FrameWnd.h"
 #include "host/HostApi.h"
-#include "host/SplitPath.h"
+#include "host/TextConvert.h"
 #include "thumbs/Ombra3View.h"
 
 bool CMdiMixin::SetFrameResource(UINT resourceId) {
@@ -53,7 +53,7 @@ bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
   }
   frame->UpdateWindow();
   frame->EnableAccept(false);
-  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(SplitPath(g_pDoc->m_strName).baseName);
+  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(SplitAnsiPath(g_pDoc->m_strName).baseName);
   g_pDoc->m_strName.clear();
   return true;
 }
