@@ -207,10 +207,15 @@ bool CWaitingTreeCtrl::GetIconRect(HTREEITEM item, RECT *rect) const {
   return true;
 }
 
+COLORREF CWaitingTreeCtrl::BackgroundColor() const {
+  const COLORREF own = GetBkColor();
+  return own == CLR_NONE ? GetSysColor(COLOR_WINDOW) : own & 0xFFFFFF;
+}
+
 void CWaitingTreeCtrl::EraseIconArea() {
   RECT icon;
   if (!m_bEraseIcon || !GetIconRect(m_hPlaceholder, &icon)) return;
-  const BrushHandle background(CreateSolidBrush(GetBkColor() & 0xFFFFFF));
+  const BrushHandle background(CreateSolidBrush(BackgroundColor()));
   const ClientDeviceContext dc(m_hWnd);
   if (m_hPlaceholderIcon)
     DrawIconEx(dc.Get(), icon.left, icon.top, m_hPlaceholderIcon, icon.right - icon.left, icon.bottom - icon.top, 0,

@@ -51,6 +51,9 @@ class CWaitingTreeCtrl : public fw::CTreeCtrl {
   // The small-icon square whose right edge lies 3 pixels left of the item's text; false when
   // the tree has no image list or no rectangle for the item.
   bool GetIconRect(HTREEITEM item, RECT *rect) const;
+  // The colour the tree paints its background with: its own, or the window colour when it has
+  // none (the tree then reports no colour at all, which read as a colour is white).
+  COLORREF BackgroundColor() const;
 
   // Animation state; the handles exist only while a load runs.
   KernelHandle m_hThread;

@@ -48,12 +48,12 @@ class RecordingTree : public CWaitingTreeCtrl {
   bool FillItemChildren(HTREEITEM item) override {
     ++fills;
     placeholderGoneDuringFill = GetChildItem(item) == nullptr;
-    if (duringFill) duringFill();
     SetProgress(0, 0);
     for (int i = 0; i < children; ++i, Sleep(60)) {
       InsertItem("child", item);
       StepProgress(1);
     }
+    if (duringFill) duringFill();
     return fillResult;
   }
 };
@@ -61,6 +61,8 @@ class RecordingTree : public CWaitingTreeCtrl {
 class Tree : public CHourglassFX<CProgressFX<RecordingTree>> {
  public:
   std::vector<int> frames, fillWidths;
+  Tree() { m_bEraseIcon = 1; }
+  void UseCursor(HCURSOR cursor) { m_hCursor.Reset(cursor); }
 
  protected:
   void OnWaitTick(bool isTick, int total, int done) override {
@@ -228,5 +230,49 @@ TEST_F(WaitingTree, NoLoadBesideARunningOneOrWithoutItsPlaceholder) {
     m_tree.Expand(other, TVE_EXPAND);
     EXPECT_TRUE(Expanded(other)) << "the next expansion loads";
   }
+}
+
+// With no image list the hourglass has no place, and is not drawn at all. The loading effects
+// draw in the colours the tree shows: the window colour when the tree has none of its own.
+TEST_F(WaitingTree, NoHourglassWithoutItsPlaceAndTheTreesColours) {
+  m_tree.SetImageList(nullptr, TVSIL_NORMAL);
+  m_tree.UseCursor(static_cast<HCURSOR>(LoadImageA(nullptr, MAKEINTRESOURCEA(32512), IMAGE_CURSOR, 0, 0, LR_DEFAULTSIZE)));
+  HTREEITEM unmeasured = Folder("unmeasured");
+  m_tree.UpdateWindow();
+  RECT row{};
+  m_tree.GetItemRect(unmeasured, &row, FALSE);
+  auto corner = [&] {  // where an hourglass at no place would go, over the first item's row
+    std::vector<COLORREF> pixels;
+    const HDC dc = GetDC(m_tree.m_hWnd);
+    for (int y = 0; y < row.bottom; ++y)
+      for (int x = 0; x < GetSystemMetrics(SM_CXICON); ++x) pixels.push_back(GetPixel(dc, x, y));
+    ReleaseDC(m_tree.m_hWnd, dc);
+    return pixels;
+  };
+  const std::vector<COLORREF> before = corner();
+  std::vector<COLORREF> during;
+  m_tree.children = 8;  // 480 ms: several ticks
+  m_tree.duringFill = [&] { during = corner(); };
+  m_tree.Expand(unmeasured, TVE_EXPAND);
+  EXPECT_GE(m_tree.frames.size(), 2u);
+  EXPECT_TRUE(during == before) << "nothing drawn over the first item";
+
+  // A cursor that is all transparent: the hourglass shows its background brush alone.
+  const std::vector<BYTE> clear(32 * 32 / 8, 0xFF), none(32 * 32 / 8, 0x00);
+  m_tree.UseCursor(CreateCursor(nullptr, 0, 0, 32, 32, clear.data(), none.data()));
+  m_tree.SetImageList(m_images, TVSIL_NORMAL);
+  const int element = COLOR_WINDOW;
+  const COLORREF window = GetSysColor(COLOR_WINDOW), theme = RGB(40, 60, 80);
+  SetSysColors(1, &element, &theme);
+  COLORREF erased = CLR_INVALID;
+  m_tree.children = 4;
+  m_tree.duringFill = [&] {
+    const HDC dc = GetDC(m_tree.m_hWnd);
+    erased = GetPixel(dc, m_tree.IconRect().left, m_tree.IconRect().top);
+    ReleaseDC(m_tree.m_hWnd, dc);
+  };
+  m_tree.Expand(Folder("folder"), TVE_EXPAND);
+  SetSysColors(1, &element, &window);
+  EXPECT_EQ(erased, theme) << "the icon's place erased, and the hourglass drawn, in the window colour";
 }
 }  // namespace
