@@ -244,7 +244,10 @@ BOOL CShellTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, L
       case TVN_GETDISPINFOW: OnGetDispInfo(reinterpret_cast<NMTVDISPINFOA *>(lParam)->item); break;
       case TVN_SELCHANGEDA:
       case TVN_SELCHANGEDW: OnSelChanged(tree->itemNew.hItem); break;
-      case NM_RCLICK: ShowFolderSettingsMenu(); break;
+      case NM_RCLICK:
+        ShowFolderSettingsMenu();
+        *result = 1;  // handled: the tree sends no context menu message after it
+        return TRUE;
       case TVN_DELETEITEMA:
       case TVN_DELETEITEMW: delete reinterpret_cast<ShellItemData *>(tree->itemOld.lParam); break;
       case TVN_SELCHANGINGA:
@@ -288,16 +291,28 @@ void CShellTreeCtrl::OnSelChanged(HTREEITEM item) {
   SetFocus();
 }
 
+LRESULT CShellTreeCtrl::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+  if (message == WM_RBUTTONDOWN) m_ptRightClick = POINT{static_cast<short>(LOWORD(lParam)), static_cast<short>(HIWORD(lParam))};
+  // From the keyboard (the context-menu key, Shift+F10) the menu is for the row with the caret.
+  const bool fromKeyboard = message == WM_CONTEXTMENU && LOWORD(lParam) == 0xFFFF && HIWORD(lParam) == 0xFFFF;
+  const bool shiftF10 = message == WM_SYSKEYDOWN && wParam == VK_F10 && GetKeyState(VK_SHIFT) < 0;
+  if (fromKeyboard || shiftF10) {
+    RunFolderSettingsMenu(GetSelectedItem());
+    return 0;
+  }
+  return CWaitingTreeCtrl::WindowProc(message, wParam, lParam);
+}
+
 void CShellTreeCtrl::ShowFolderSettingsMenu() {
-  // The clicked item is the one the menu is for. Some tree controls leave the drop highlight
-  // where it was during a right click: the click's own position decides then. The highlight
-  // itself stays on the folder shown, as Wine's tree would not give it back to that folder.
-  const DWORD position = GetMessagePos();
+  // The menu is for the row where the right button went down, wherever on the row: its indent,
+  // its button, its picture, its text or right of it. The drop highlight cannot tell: some tree
+  // controls leave it where it was during a right click, and it stays on the folder shown, as
+  // Wine's tree would not give it back to that folder.
+  constexpr UINT kOnRow = TVHT_ONITEM | TVHT_ONITEMINDENT | TVHT_ONITEMBUTTON | TVHT_ONITEMRIGHT;
   TVHITTESTINFO hit{};
-  hit.pt = POINT{static_cast<short>(LOWORD(position)), static_cast<short>(HIWORD(position))};
-  ScreenToClient(m_hWnd, &hit.pt);
+  hit.pt = m_ptRightClick;
   const HTREEITEM clicked = HitTest(&hit);
-  RunFolderSettingsMenu(clicked && (hit.flags & TVHT_ONITEM) ? clicked : GetDropHilightItem());
+  if (clicked && (hit.flags & kOnRow)) RunFolderSettingsMenu(clicked);
 }
 
 void CShellTreeCtrl::RunFolderSettingsMenu(HTREEITEM item) {

@@ -30,6 +30,7 @@ class CShellTreeCtrl : public CWaitingTreeCtrl {
   bool ExpandToFolder(const std::string &folder);
 
   BOOL OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, LRESULT *result) override;
+  LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
  protected:
   bool FillItemChildren(HTREEITEM item) override;
@@ -44,4 +45,5 @@ class CShellTreeCtrl : public CWaitingTreeCtrl {
   void RunFolderSettingsMenu(HTREEITEM item);
 
   CDesktopFolderRef m_desktop;
+  POINT m_ptRightClick{};  // where the right button last went down, in client coordinates
 };

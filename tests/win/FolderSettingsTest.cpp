@@ -233,4 +233,57 @@ TEST_F(FolderSettings, AFolderPathTooLongForItsSettingsFileIsToldNotIgnored) {
             events.end());
   EXPECT_EQ(GetFileAttributesA((folder + "\\datains.ini").c_str()), INVALID_FILE_ATTRIBUTES);
 }
+
+// Presses `key` as a person does, with `held` (say Shift) held down; the keys go to the window
+// with the keyboard focus.
+void Press(WORD key, WORD held = 0) {
+  if (held) keybd_event(static_cast<BYTE>(held), 0, 0, 0);
+  keybd_event(static_cast<BYTE>(key), 0, 0, 0);
+  keybd_event(static_cast<BYTE>(key), 0, KEYEVENTF_KEYUP, 0);
+  if (held) keybd_event(static_cast<BYTE>(held), 0, KEYEVENTF_KEYUP, 0);
+}
+
+// The menu is for the row under the cursor wherever on the row the click is (its button, its
+// indent), and from the keyboard (the context-menu key, Shift+F10) for the row with the caret.
+TEST_F(FolderSettings, TheMenuIsForTheRowClickedOrForTheCaret) {
+  const ScratchFolder scratch("rows");
+  for (const char *folder : {"b", "c", "c\\sub"}) CreateDirectoryA((scratch.Path() + "\\" + folder).c_str(), nullptr);
+  const std::string start = scratch.Path() + "\\";
+  auto select = [](HWND tree, HTREEITEM row) { SendMessageA(tree, TVM_SELECTITEM, TVGN_CARET, reinterpret_cast<LPARAM>(row)); };
+  const struct {
+    const char *name, *row;
+    std::function<bool(HWND tree, HTREEITEM row)> open;
+  } cases[] = {
+      {"a right click on the row's button", "c",
+       [](HWND tree, HTREEITEM row) {
+         RECT text{};
+         std::memcpy(&text, &row, sizeof row);
+         SendMessageA(tree, TVM_GETITEMRECT, TRUE, reinterpret_cast<LPARAM>(&text));
+         const int indent = static_cast<int>(SendMessageA(tree, TVM_GETINDENT, 0, 0));
+         return ChooseFolderSettings(tree, row, text.left - GetSystemMetrics(SM_CXSMICON) - indent / 2);
+       }},
+      {"a right click on the row's indent", "b", [](HWND tree, HTREEITEM row) { return ChooseFolderSettings(tree, row, 1); }},
+      {"the context-menu key", "b", [&](HWND tree, HTREEITEM row) { return select(tree, row), Press(VK_APPS), ChooseFromMenu(); }},
+      {"Shift+F10", "c", [&](HWND tree, HTREEITEM row) { return select(tree, row), Press(VK_F10, VK_SHIFT), ChooseFromMenu(); }},
+  };
+  for (const auto &c : cases) {
+    SCOPED_TRACE(c.name);
+    Browse(BrowseArgs(std::wstring(start.begin(), start.end()).c_str()), [&](HWND frame) {
+      HWND tree = FindTree(frame);
+      const HTREEITEM row = ChildNamed(tree, TreeNext(tree, nullptr, TVGN_CARET), c.row);
+      if (row && c.open(tree, row)) {
+        if (HWND dialog = WaitForWindow("#32770", "Folder settings", 5000)) {
+          SetDlgItemTextA(dialog, kCommand, "X");
+          SendMessageA(dialog, WM_COMMAND, IDOK, 0);
+        }
+      }
+      PostMessageA(frame, WM_CLOSE, 0, 0);
+    });
+    for (const char *folder : {"", "b\\", "c\\"}) {
+      const std::string file = scratch.Path() + "\\" + folder + "datains.ini";
+      EXPECT_EQ(GetFileAttributesA(file.c_str()) != INVALID_FILE_ATTRIBUTES, folder == std::string(c.row) + "\\") << file;
+      DeleteFileA(file.c_str());
+    }
+  }
+}
 }  // namespace
