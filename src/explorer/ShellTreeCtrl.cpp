@@ -2,6 +2,7 @@
 
 #include "catalogue/Ombra3Doc.h"
 #include "explorer/MainFrame.h"
+#include "explorer/ShellAttributes.h"
 #include "explorer/ShellString.h"
 #include "fw/Menu.h"
 #include "host/HostApi.h"
@@ -35,12 +36,7 @@ int SystemIconIndex(LPCITEMIDLIST absolute, UINT extra) {
   return info.iIcon;
 }
 
-ULONG Attributes(const ShellItemData &data, ULONG wanted) {
-  LPCITEMIDLIST child = data.ChildId();
-  ULONG attributes = wanted;
-  if (!data.pParentFolder || FAILED(data.pParentFolder->GetAttributesOf(1, &child, &attributes))) return 0;
-  return attributes;
-}
+ULONG Attributes(const ShellItemData &data, ULONG wanted) { return ShellAttributes(data.pParentFolder, data.ChildId(), wanted); }
 
 int CALLBACK CompareItems(LPARAM first, LPARAM second, LPARAM) {
   return CShellTreeCtrl::CompareSiblings(*reinterpret_cast<const ShellItemData *>(first),
@@ -128,15 +124,7 @@ void CShellTreeCtrl::FillItemDisplay(TVITEMA &item, const ShellItemData &data) c
     const bool folder = Attributes(data, SFGAO_FOLDER) & SFGAO_FOLDER;
     item.iSelectedImage = SystemIconIndex(data.pidl.Get(), folder ? SHGFI_OPENICON : 0);
   }
-  if (item.mask & TVIF_CHILDREN) {
-    const ULONG attributes = Attributes(data, SFGAO_FOLDER);
-    if (!(attributes & SFGAO_FOLDER))
-      item.cChildren = 0;
-    else if (!(data.nFlags & kListNonFolders) && !(attributes & SFGAO_REMOVABLE))
-      item.cChildren = (Attributes(data, SFGAO_HASSUBFOLDER) & SFGAO_HASSUBFOLDER) ? 1 : 0;
-    else
-      item.cChildren = 1;
-  }
+  if (item.mask & TVIF_CHILDREN) item.cChildren = ChildrenButton(data.pParentFolder, child, data.nFlags & kListNonFolders);
 }
 
 IShellFolder *CShellTreeCtrl::BindFolder(LPCITEMIDLIST absolute) const {
