@@ -46,12 +46,9 @@ LRESULT CLeftView::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
     }
     case WM_SIZE: {
       const LRESULT result = CView::WindowProc(message, wParam, lParam);
-      if (m_wndTree.m_hWnd) {
+      // The tree keeps where the person scrolled it: a drag of the splitter does not move it.
+      if (m_wndTree.m_hWnd)
         ::SetWindowPos(m_wndTree.m_hWnd, nullptr, 0, 0, LOWORD(lParam), HIWORD(lParam), SWP_NOMOVE | SWP_NOZORDER);
-        // The tree was laid out at another size: the folder shown stays in sight.
-        if (HTREEITEM shown = m_wndTree.GetSelectedItem())
-          m_wndTree.SendMessage(TVM_ENSUREVISIBLE, 0, reinterpret_cast<LPARAM>(shown));
-      }
       return result;
     }
     default: return CView::WindowProc(message, wParam, lParam);

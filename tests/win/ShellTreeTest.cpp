@@ -105,4 +105,29 @@ TEST_F(ShellTree, FoldersTheLabelsDoNotReachOpenByTheirIds) {
     EXPECT_EQ(Lower(current), Lower(scratch.Path() + "\\" + c.folder));
   }
 }
+
+// A drag of the splitter resizes the tree's pane: the tree stays where the person scrolled it,
+// even with the folder shown out of sight.
+TEST_F(ShellTree, ResizingThePaneKeepsTheScrollPosition) {
+  const ScratchFolder scratch("scroll");
+  const std::string plans = scratch.Path() + "\\Plans";
+  CreateDirectoryA(plans.c_str(), nullptr);
+  for (int i = 0; i < 60; ++i) CreateDirectoryA((plans + "\\f" + std::to_string(10 + i)).c_str(), nullptr);
+  const std::string start = plans + "\\";
+  std::string before, after;
+  Browse(BrowseArgs(std::wstring(start.begin(), start.end()).c_str()), [&](HWND frame) {
+    HWND tree = FindTree(frame);
+    const HTREEITEM scrolledTo = ChildNamed(tree, TreeNext(tree, nullptr, TVGN_CARET), "f20");
+    SendMessageA(tree, TVM_SELECTITEM, TVGN_FIRSTVISIBLE, reinterpret_cast<LPARAM>(scrolledTo));
+    before = ItemText(tree, TreeNext(tree, nullptr, TVGN_FIRSTVISIBLE));
+    HWND pane = GetParent(tree);
+    RECT rect;
+    GetClientRect(pane, &rect);
+    SetWindowPos(pane, nullptr, 0, 0, rect.right + 40, rect.bottom, SWP_NOMOVE | SWP_NOZORDER);
+    after = ItemText(tree, TreeNext(tree, nullptr, TVGN_FIRSTVISIBLE));
+    PostMessageA(frame, WM_CLOSE, 0, 0);
+  });
+  EXPECT_EQ(before, "f20");
+  EXPECT_EQ(after, "f20");
+}
 }  // namespace
