@@ -56,7 +56,10 @@ int acedAlert(const ACHAR *text) {
     std::fprintf(stderr, "alert: %s\n", Escaped(message).c_str());
     std::fflush(stderr);
   } else {
-    MessageBoxW(State().mainFrame, message.c_str(), L"AutoCAD Message", MB_OK | MB_ICONWARNING);
+    // Owned by the window the person works in (a module's dialog, say): owned by the main
+    // window, which a module disables, it could fall behind that dialog and leave it usable.
+    HWND owner = GetActiveWindow();
+    MessageBoxW(owner ? owner : State().mainFrame, message.c_str(), L"AutoCAD Message", MB_OK | MB_ICONWARNING);
   }
   return RTNORM;
 }

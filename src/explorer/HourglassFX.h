@@ -18,13 +18,16 @@ class CHourglassFX : public T {
     m_nFrame = 0;
     RECT icon;
     if (this->GetIconRect(placeholder, &icon)) m_rcIcon = icon;
-    m_background.Reset(CreateSolidBrush(this->GetBkColor() & 0xFFFFFF));
+    m_background.Reset(CreateSolidBrush(this->BackgroundColor()));
   }
 
   void OnWaitTick(bool isTick, int total, int done) override {
     T::OnWaitTick(isTick, total, done);
     if (!isTick) return;
     m_nFrame = (m_nFrame + 1) % kHourglassFrames;
+    // Never measured, the icon's place is empty: drawn there, the hourglass would cover the
+    // first item.
+    if (IsRectEmpty(&m_rcIcon)) return;
     const ClientDeviceContext dc(this->m_hWnd);
     DrawIconEx(dc.Get(), m_rcIcon.left, m_rcIcon.top, m_hCursor.Get(), m_rcIcon.right - m_rcIcon.left,
                m_rcIcon.bottom - m_rcIcon.top, static_cast<UINT>(m_nFrame), m_background.Get(), DI_NORMAL);

@@ -3,6 +3,7 @@
 #include "catalogue/Ombra3Doc.h"
 #include "fw/FrameworkIds.h"
 #include "host/ModuleGlobals.h"
+#include "host/TextConvert.h"
 
 CLeftView *g_pLeftView = nullptr;
 
@@ -22,8 +23,16 @@ BOOL CLeftView::Create(LPCSTR className, LPCSTR windowName, DWORD style, const R
   if (!m_wndTree.Create(kTreeStyle, RECT{0, 0, 0, 0}, this, AFX_IDW_PANE_FIRST)) return FALSE;
   m_wndTree.InsertRootItem();
   if (g_pDoc) {
-    if (g_szStartShellPath[0]) g_pDoc->m_strShellPath = g_szStartShellPath;
+    // The folder itself, for where the walk along labels stops short: the start folder's
+    // drive and directory, or the folder shown last.
+    std::string folder = g_pDoc->m_strPath;
+    if (g_szStartFolder[0]) {
+      const PathParts start = SplitAnsiPath(g_szStartFolder);
+      folder = start.drive + start.directory;
+      g_pDoc->m_strShellPath = g_szStartShellPath;
+    }
     m_wndTree.ExpandToPath(g_pDoc->m_strShellPath);
+    if (!m_wndTree.GetStartItem()) m_wndTree.ExpandToFolder(folder);
   }
   return created;
 }
@@ -37,12 +46,9 @@ LRESULT CLeftView::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
     }
     case WM_SIZE: {
       const LRESULT result = CView::WindowProc(message, wParam, lParam);
-      if (m_wndTree.m_hWnd) {
+      // The tree keeps where the person scrolled it: a drag of the splitter does not move it.
+      if (m_wndTree.m_hWnd)
         ::SetWindowPos(m_wndTree.m_hWnd, nullptr, 0, 0, LOWORD(lParam), HIWORD(lParam), SWP_NOMOVE | SWP_NOZORDER);
-        // The tree was laid out at another size: the folder shown stays in sight.
-        if (HTREEITEM shown = m_wndTree.GetSelectedItem())
-          m_wndTree.SendMessage(TVM_ENSUREVISIBLE, 0, reinterpret_cast<LPARAM>(shown));
-      }
       return result;
     }
     default: return CView::WindowProc(message, wParam, lParam);

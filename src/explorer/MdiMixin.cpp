@@ -7,7 +7,7 @@
 #include "fw/Dialog.h"
 #include "fw/FrameWnd.h"
 #include "host/HostApi.h"
-#include "host/SplitPath.h"
+#include "host/TextConvert.h"
 #include "thumbs/Ombra3View.h"
 
 bool CMdiMixin::SetFrameResource(UINT resourceId) {
@@ -25,12 +25,19 @@ bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
     return false;
   }
   m_pMainWnd = dialog;
-  frame->ShowWindow(SW_SHOW);
 
+  // Placed and sized before it is first shown: the frame never flashes at its default place.
   RECT dialogRect;
   dialog->GetWindowRect(&dialogRect);
   const FramePlacement placement = PlaceFrame({dialogRect.left, dialogRect.top, dialogRect.right, dialogRect.bottom},
                                               g_pDoc->m_nWindowWidth, g_pDoc->m_nWindowHeight);
+  if (placement.maximized) {
+    frame->ShowWindow(SW_SHOWMAXIMIZED);
+  } else {
+    if (placement.resized)
+      ::MoveWindow(frame->m_hWnd, placement.x, placement.y, g_pDoc->m_nWindowWidth, g_pDoc->m_nWindowHeight, FALSE);
+    frame->ShowWindow(SW_SHOW);
+  }
 
   // The start item becomes the first visible, the highlighted and the selected item: the
   // selection scans its folder and the view shows it.
@@ -44,16 +51,9 @@ bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
     }
   }
 
-  if (placement.maximized) {
-    frame->ShowWindow(SW_SHOWMAXIMIZED);
-  } else {
-    if (placement.resized)
-      ::MoveWindow(frame->m_hWnd, placement.x, placement.y, g_pDoc->m_nWindowWidth, g_pDoc->m_nWindowHeight, TRUE);
-    frame->ShowWindow(SW_SHOW);
-  }
   frame->UpdateWindow();
   frame->EnableAccept(false);
-  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(SplitPath(g_pDoc->m_strName).baseName);
+  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(SplitAnsiPath(g_pDoc->m_strName).baseName);
   g_pDoc->m_strName.clear();
   return true;
 }

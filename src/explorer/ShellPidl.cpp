@@ -41,4 +41,29 @@ LPITEMIDLIST Copy(LPCITEMIDLIST list) {
   return list ? Combine(list, nullptr) : nullptr;
 }
 
+UINT Count(LPCITEMIDLIST list) {
+  UINT count = 0;
+  for (LPCITEMIDLIST item = list && list->mkid.cb ? list : nullptr; item; item = Next(item)) ++count;
+  return count;
+}
+
+LPCITEMIDLIST At(LPCITEMIDLIST list, UINT index) {
+  LPCITEMIDLIST item = list && list->mkid.cb ? list : nullptr;
+  for (; item && index; --index) item = Next(item);
+  return item;
+}
+
+LPITEMIDLIST Head(LPCITEMIDLIST list, UINT count) {
+  const LPCITEMIDLIST end = At(list, count);
+  const UINT size = end ? static_cast<UINT>(reinterpret_cast<const BYTE *>(end) - reinterpret_cast<const BYTE *>(list))
+                        : Size(list);
+  const CShellMallocRef malloc;
+  if (!malloc.Get()) return nullptr;
+  auto *head = static_cast<BYTE *>(malloc.Get()->Alloc(size + sizeof(USHORT)));
+  if (!head) return nullptr;
+  if (size) std::memcpy(head, list, size);
+  std::memset(head + size, 0, sizeof(USHORT));
+  return reinterpret_cast<LPITEMIDLIST>(head);
+}
+
 }  // namespace pidl

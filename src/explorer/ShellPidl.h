@@ -16,6 +16,13 @@ LPCITEMIDLIST Last(LPCITEMIDLIST list);
 LPITEMIDLIST Combine(LPCITEMIDLIST first, LPCITEMIDLIST second);
 // A copy of the items of `list` and its terminator; null for null.
 LPITEMIDLIST Copy(LPCITEMIDLIST list);
+// The number of items; 0 for null.
+UINT Count(LPCITEMIDLIST list);
+// The item at `index` (0 is the first), or null when the list has no such item.
+LPCITEMIDLIST At(LPCITEMIDLIST list, UINT index);
+// A new list of the first `count` items of `list` (fewer when it has fewer), from the shell's
+// allocator; null when it cannot allocate.
+LPITEMIDLIST Head(LPCITEMIDLIST list, UINT count);
 }  // namespace pidl
 
 // Owns a pointer to a shared-allocator object, freed when replaced or destroyed.

@@ -2,8 +2,11 @@
 
 #include "catalogue/Ombra3Doc.h"
 #include "explorer/MainFrame.h"
+#include "explorer/ShellAttributes.h"
 #include "explorer/ShellString.h"
 #include "fw/Menu.h"
+#include "host/HostApi.h"
+#include "host/TextConvert.h"
 #include "settings/DialogSetLa.h"
 #include "thumbs/Ombra3View.h"
 
@@ -33,12 +36,7 @@ int SystemIconIndex(LPCITEMIDLIST absolute, UINT extra) {
   return info.iIcon;
 }
 
-ULONG Attributes(const ShellItemData &data, ULONG wanted) {
-  LPCITEMIDLIST child = data.ChildId();
-  ULONG attributes = wanted;
-  if (!data.pParentFolder || FAILED(data.pParentFolder->GetAttributesOf(1, &child, &attributes))) return 0;
-  return attributes;
-}
+ULONG Attributes(const ShellItemData &data, ULONG wanted) { return ShellAttributes(data.pParentFolder, data.ChildId(), wanted); }
 
 int CALLBACK CompareItems(LPARAM first, LPARAM second, LPARAM) {
   return CShellTreeCtrl::CompareSiblings(*reinterpret_cast<const ShellItemData *>(first),
@@ -47,6 +45,12 @@ int CALLBACK CompareItems(LPARAM first, LPARAM second, LPARAM) {
 
 bool FolderPath(const ShellItemData *data, char (&path)[MAX_PATH]) {
   return data && SHGetPathFromIDListA(data->pidl.Get(), path);
+}
+
+// Whether two absolute lists name the same object, as the Desktop compares them.
+bool SameIds(IShellFolder *desktop, LPCITEMIDLIST first, LPCITEMIDLIST second) {
+  const HRESULT hr = desktop ? desktop->CompareIDs(0, first, second) : E_FAIL;
+  return SUCCEEDED(hr) && static_cast<short>(HRESULT_CODE(hr)) == 0;
 }
 }  // namespace
 
@@ -120,25 +124,22 @@ void CShellTreeCtrl::FillItemDisplay(TVITEMA &item, const ShellItemData &data) c
     const bool folder = Attributes(data, SFGAO_FOLDER) & SFGAO_FOLDER;
     item.iSelectedImage = SystemIconIndex(data.pidl.Get(), folder ? SHGFI_OPENICON : 0);
   }
-  if (item.mask & TVIF_CHILDREN) {
-    const ULONG attributes = Attributes(data, SFGAO_FOLDER);
-    if (!(attributes & SFGAO_FOLDER))
-      item.cChildren = 0;
-    else if (!(data.nFlags & kListNonFolders) && !(attributes & SFGAO_REMOVABLE))
-      item.cChildren = (Attributes(data, SFGAO_HASSUBFOLDER) & SFGAO_HASSUBFOLDER) ? 1 : 0;
-    else
-      item.cChildren = 1;
-  }
+  if (item.mask & TVIF_CHILDREN) item.cChildren = ChildrenButton(data.pParentFolder, child, data.nFlags & kListNonFolders);
 }
 
-bool CShellTreeCtrl::FillChildren(HTREEITEM parent, LPCITEMIDLIST parentPidl, UINT flags) {
+IShellFolder *CShellTreeCtrl::BindFolder(LPCITEMIDLIST absolute) const {
   IShellFolder *folder = nullptr;
-  if (pidl::Size(parentPidl) == 0) {
+  if (pidl::Size(absolute) == 0) {
     folder = m_desktop.Get();
     if (folder) folder->AddRef();
   } else if (m_desktop.Get()) {
-    m_desktop.Get()->BindToObject(parentPidl, nullptr, IID_IShellFolder, reinterpret_cast<void **>(&folder));
+    m_desktop.Get()->BindToObject(absolute, nullptr, IID_IShellFolder, reinterpret_cast<void **>(&folder));
   }
+  return folder;
+}
+
+bool CShellTreeCtrl::FillChildren(HTREEITEM parent, LPCITEMIDLIST parentPidl, UINT flags) {
+  IShellFolder *folder = BindFolder(parentPidl);
   if (!folder) return false;
 
   SHCONTF listing = SHCONTF_FOLDERS;
@@ -172,6 +173,46 @@ int CShellTreeCtrl::CompareSiblings(const ShellItemData &first, const ShellItemD
   return order < 0 ? -1 : order > 0 ? 1 : 0;
 }
 
+bool CShellTreeCtrl::ExpandToFolder(const std::string &folder) {
+  IShellFolder *desktop = m_desktop.Get();
+  std::wstring name = ToWide(folder.c_str());
+  LPITEMIDLIST parsed = nullptr;
+  if (!desktop || folder.empty() ||
+      FAILED(desktop->ParseDisplayName(m_hWnd, nullptr, name.data(), nullptr, &parsed, nullptr)) || !parsed)
+    return false;
+  const CShellPidl target(parsed);
+  const UINT depth = pidl::Count(target.Get());
+  // The root is the Desktop, whose list is empty: every parsed folder lies below it.
+  HTREEITEM item = GetRootItem();
+  for (UINT level = 0; item && level < depth; ++level) {
+    Expand(item, TVE_EXPAND);
+    item = ChildToward(item, target.Get(), level);
+  }
+  if (!item) return false;
+  Expand(item, TVE_EXPAND);
+  m_hStartItem = item;
+  return true;
+}
+
+// The child of `item` (whose list has `level` items) on the way to `target`: the listed child
+// with the same ids as the target's first level + 1 items, or else that item of the target
+// added as a child, as a folder the tree does not list (a hidden one) is.
+HTREEITEM CShellTreeCtrl::ChildToward(HTREEITEM item, LPCITEMIDLIST target, UINT level) {
+  const auto *parent = reinterpret_cast<const ShellItemData *>(GetItemData(item));
+  const CShellPidl way(pidl::Head(target, level + 1));
+  if (!parent || !way.Get()) return nullptr;
+  for (HTREEITEM child = GetChildItem(item); child; child = GetNextSiblingItem(child)) {
+    const auto *data = reinterpret_cast<const ShellItemData *>(GetItemData(child));
+    if (data && SameIds(m_desktop.Get(), data->pidl.Get(), way.Get())) return child;
+  }
+  IShellFolder *folder = BindFolder(parent->pidl.Get());
+  if (!folder) return nullptr;
+  const CShellPidl id(pidl::Head(pidl::At(target, level), 1));
+  HTREEITEM added = id.Get() ? InsertShellItem(item, folder, parent->pidl.Get(), id.Get(), parent->nFlags & kInheritedFlags) : nullptr;
+  folder->Release();
+  return added;
+}
+
 bool CShellTreeCtrl::FillItemChildren(HTREEITEM item) {
   const auto *data = item == TVI_ROOT ? nullptr : reinterpret_cast<const ShellItemData *>(GetItemData(item));
   if (!data) return true;
@@ -191,7 +232,10 @@ BOOL CShellTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, L
       case TVN_GETDISPINFOW: OnGetDispInfo(reinterpret_cast<NMTVDISPINFOA *>(lParam)->item); break;
       case TVN_SELCHANGEDA:
       case TVN_SELCHANGEDW: OnSelChanged(tree->itemNew.hItem); break;
-      case NM_RCLICK: ShowFolderSettingsMenu(); break;
+      case NM_RCLICK:
+        ShowFolderSettingsMenu();
+        *result = 1;  // handled: the tree sends no context menu message after it
+        return TRUE;
       case TVN_DELETEITEMA:
       case TVN_DELETEITEMW: delete reinterpret_cast<ShellItemData *>(tree->itemOld.lParam); break;
       case TVN_SELCHANGINGA:
@@ -235,16 +279,28 @@ void CShellTreeCtrl::OnSelChanged(HTREEITEM item) {
   SetFocus();
 }
 
+LRESULT CShellTreeCtrl::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+  if (message == WM_RBUTTONDOWN) m_ptRightClick = POINT{static_cast<short>(LOWORD(lParam)), static_cast<short>(HIWORD(lParam))};
+  // From the keyboard (the context-menu key, Shift+F10) the menu is for the row with the caret.
+  const bool fromKeyboard = message == WM_CONTEXTMENU && LOWORD(lParam) == 0xFFFF && HIWORD(lParam) == 0xFFFF;
+  const bool shiftF10 = message == WM_SYSKEYDOWN && wParam == VK_F10 && GetKeyState(VK_SHIFT) < 0;
+  if (fromKeyboard || shiftF10) {
+    RunFolderSettingsMenu(GetSelectedItem());
+    return 0;
+  }
+  return CWaitingTreeCtrl::WindowProc(message, wParam, lParam);
+}
+
 void CShellTreeCtrl::ShowFolderSettingsMenu() {
-  // The clicked item is the one the menu is for. Some tree controls leave the drop highlight
-  // where it was during a right click: the click's own position decides then. The highlight
-  // itself stays on the folder shown, as Wine's tree would not give it back to that folder.
-  const DWORD position = GetMessagePos();
+  // The menu is for the row where the right button went down, wherever on the row: its indent,
+  // its button, its picture, its text or right of it. The drop highlight cannot tell: some tree
+  // controls leave it where it was during a right click, and it stays on the folder shown, as
+  // Wine's tree would not give it back to that folder.
+  constexpr UINT kOnRow = TVHT_ONITEM | TVHT_ONITEMINDENT | TVHT_ONITEMBUTTON | TVHT_ONITEMRIGHT;
   TVHITTESTINFO hit{};
-  hit.pt = POINT{static_cast<short>(LOWORD(position)), static_cast<short>(HIWORD(position))};
-  ScreenToClient(m_hWnd, &hit.pt);
+  hit.pt = m_ptRightClick;
   const HTREEITEM clicked = HitTest(&hit);
-  RunFolderSettingsMenu(clicked && (hit.flags & TVHT_ONITEM) ? clicked : GetDropHilightItem());
+  if (clicked && (hit.flags & kOnRow)) RunFolderSettingsMenu(clicked);
 }
 
 void CShellTreeCtrl::RunFolderSettingsMenu(HTREEITEM item) {
@@ -259,7 +315,10 @@ void CShellTreeCtrl::RunFolderSettingsMenu(HTREEITEM item) {
   const UINT chosen = menu.TrackPopupMenu(TPM_RETURNCMD | TPM_RIGHTBUTTON | TPM_NONOTIFY, corner.x, corner.y, m_hWnd);
   if (chosen == kFolderSettingsCommand) {
     CDialogSetLa dialog(this);
-    if (dialog.SetFolder(path)) dialog.DoModal();
+    if (dialog.SetFolder(path))
+      dialog.DoModal();
+    else
+      acedAlert(L"The folder's path is too long for its settings file");
     SetFocus();
   }
 }

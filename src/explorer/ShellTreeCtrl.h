@@ -6,6 +6,8 @@
 #include "explorer/ShellItemData.h"
 #include "explorer/WaitingTreeCtrl.h"
 
+#include <string>
+
 class CShellTreeCtrl : public CWaitingTreeCtrl {
  public:
   CShellTreeCtrl() = default;
@@ -22,17 +24,26 @@ class CShellTreeCtrl : public CWaitingTreeCtrl {
   void FillItemDisplay(TVITEMA &item, const ShellItemData &data) const;
   bool FillChildren(HTREEITEM parent, LPCITEMIDLIST parentPidl, UINT flags);
   static int CompareSiblings(const ShellItemData &first, const ShellItemData &second);
+  // Opens the tree down to a file-system folder by the shell's item ids, where the walk along
+  // labels cannot (labels that are not the folders' names, hidden folders); the folder becomes
+  // the start item. False when the shell cannot parse the folder.
+  bool ExpandToFolder(const std::string &folder);
 
   BOOL OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, LRESULT *result) override;
+  LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
  protected:
   bool FillItemChildren(HTREEITEM item) override;
 
  private:
+  // The folder of an absolute list, with a reference for the caller; null when it has none.
+  IShellFolder *BindFolder(LPCITEMIDLIST absolute) const;
+  HTREEITEM ChildToward(HTREEITEM item, LPCITEMIDLIST target, UINT level);
   void OnGetDispInfo(TVITEMA &item) const;
   void OnSelChanged(HTREEITEM item);
   void ShowFolderSettingsMenu();
   void RunFolderSettingsMenu(HTREEITEM item);
 
   CDesktopFolderRef m_desktop;
+  POINT m_ptRightClick{};  // where the right button last went down, in client coordinates
 };

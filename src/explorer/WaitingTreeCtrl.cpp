@@ -43,8 +43,10 @@ BOOL CWaitingTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam,
   // The item handle and the action lie at the same place in the ANSI and the wide record.
   const auto *tree = reinterpret_cast<const NMTREEVIEWA *>(lParam);
   if (IsCode(header, TVN_ITEMEXPANDINGA, TVN_ITEMEXPANDINGW)) {
-    if (tree->action & TVE_EXPAND) PrepareLoading(tree->itemNew.hItem);
-    *result = 0;
+    // The shell may pump messages while a load enumerates: a second load then would take over
+    // the running thread's handles and brushes. The expansion is refused instead.
+    *result = (tree->action & TVE_EXPAND) && m_bLoading;
+    if ((tree->action & TVE_EXPAND) && !m_bLoading) PrepareLoading(tree->itemNew.hItem);
     return TRUE;
   }
   if (IsCode(header, TVN_ITEMEXPANDEDA, TVN_ITEMEXPANDEDW)) {
@@ -59,6 +61,9 @@ BOOL CWaitingTreeCtrl::OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam,
 }
 
 LRESULT CWaitingTreeCtrl::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+  // Numpad "*" expands every descendant, one load after another: from the Desktop that is the
+  // whole namespace, for minutes.
+  if (message == WM_KEYDOWN && wParam == VK_MULTIPLY) return 0;
   if (message == WM_ERASEBKGND && m_bSnapshotValid) {
     // While the children are filled the tree shows what it showed when the load began; the
     // animation is drawn again over it.
@@ -97,12 +102,22 @@ void CWaitingTreeCtrl::PrepareLoading(HTREEITEM item) {
   insert.item.mask = TVIF_TEXT;
   insert.item.pszText = m_strLoading.data();
   m_hPlaceholder = InsertItem(insert);
+  if (!m_hPlaceholder) {
+    // Without its placeholder the item does not open: nothing to load, the tree draws again.
+    m_hPending = nullptr;
+    SetRedraw(true);
+    return;
+  }
   m_nTotal = 1;
   m_nDone = 0;
 }
 
 void CWaitingTreeCtrl::RunLoading(HTREEITEM item) {
-  if (!m_hPending) return;
+  // Only the expansion that was prepared loads: a stray notification would delete a null
+  // placeholder, which is the whole tree.
+  if (m_bLoading || !m_hPending || m_hPending != item || !m_hPlaceholder) return;
+  m_hPending = nullptr;
+  m_bLoading = true;
   OnWaitBegin(m_hPlaceholder);
   StartAnimation();
   EraseIconArea();
@@ -134,6 +149,7 @@ void CWaitingTreeCtrl::RunLoading(HTREEITEM item) {
   }
   DropSnapshot();
   SetRedraw(true);
+  m_bLoading = false;
 }
 
 void CWaitingTreeCtrl::StartAnimation() {
@@ -191,10 +207,15 @@ bool CWaitingTreeCtrl::GetIconRect(HTREEITEM item, RECT *rect) const {
   return true;
 }
 
+COLORREF CWaitingTreeCtrl::BackgroundColor() const {
+  const COLORREF own = GetBkColor();
+  return own == CLR_NONE ? GetSysColor(COLOR_WINDOW) : own & 0xFFFFFF;
+}
+
 void CWaitingTreeCtrl::EraseIconArea() {
   RECT icon;
   if (!m_bEraseIcon || !GetIconRect(m_hPlaceholder, &icon)) return;
-  const BrushHandle background(CreateSolidBrush(GetBkColor() & 0xFFFFFF));
+  const BrushHandle background(CreateSolidBrush(BackgroundColor()));
   const ClientDeviceContext dc(m_hWnd);
   if (m_hPlaceholderIcon)
     DrawIconEx(dc.Get(), icon.left, icon.top, m_hPlaceholderIcon, icon.right - icon.left, icon.bottom - icon.top, 0,

@@ -51,6 +51,9 @@ class CWaitingTreeCtrl : public fw::CTreeCtrl {
   // The small-icon square whose right edge lies 3 pixels left of the item's text; false when
   // the tree has no image list or no rectangle for the item.
   bool GetIconRect(HTREEITEM item, RECT *rect) const;
+  // The colour the tree paints its background with: its own, or the window colour when it has
+  // none (the tree then reports no colour at all, which read as a colour is white).
+  COLORREF BackgroundColor() const;
 
   // Animation state; the handles exist only while a load runs.
   KernelHandle m_hThread;
@@ -68,7 +71,8 @@ class CWaitingTreeCtrl : public fw::CTreeCtrl {
   std::atomic<int> m_nDone{0};
   std::atomic<int> m_nTotal{0};
   HTREEITEM m_hPlaceholder = nullptr;
-  HTREEITEM m_hPending = nullptr;
+  HTREEITEM m_hPending = nullptr;  // the item prepared for a load, until the load starts
+  bool m_bLoading = false;         // a load runs: its thread and drawing objects are in use
   int m_nPendingButton = 0;  // the pending item's children button before the load
   HTREEITEM m_hStartItem = nullptr;
 

@@ -5,7 +5,7 @@
 #include "explorer/WaitingTreeCtrl.h"
 #include "thumbs/Ombra3View.h"
 
-#include <cstring>
+#include <vector>
 
 std::string CWaitingTreeCtrl::GetItemPath(HTREEITEM item) const {
   std::string path = GetItemText(item);
@@ -28,21 +28,37 @@ void CWaitingTreeCtrl::RefreshSelectedFolder() {
   if (g_pThumbView) g_pThumbView->ReloadFolder();
 }
 
+namespace {
+// The components of a path of display names, split at "\" characters: stepping by characters,
+// not bytes, so that the second byte of a double-byte character is never taken for one.
+std::vector<std::string> PathComponents(const std::string &path) {
+  std::vector<std::string> components;
+  const char *start = path.c_str();
+  for (const char *at = start;; at = CharNextA(at)) {
+    if (*at != '\\' && *at != '\0') continue;
+    components.emplace_back(start, at);
+    if (*at == '\0') break;
+    start = at + 1;
+  }
+  return components;
+}
+
+// Labels are equal as the system compares them without regard to case, in any language.
+bool SameLabel(const std::string &first, const std::string &second) {
+  return CompareStringA(LOCALE_USER_DEFAULT, NORM_IGNORECASE, first.c_str(), -1, second.c_str(), -1) == CSTR_EQUAL;
+}
+}  // namespace
+
 void CWaitingTreeCtrl::ExpandToPath(const std::string &path) {
   HTREEITEM matched = nullptr;
-  size_t start = 0;
-  while (start < path.size()) {
-    size_t end = path.find('\\', start);
-    if (end == std::string::npos) end = path.size();
-    if (end == start) break;  // an empty component ends the walk
-    const std::string component = path.substr(start, end - start);
+  for (const std::string &component : PathComponents(path)) {
+    if (component.empty()) break;  // an empty component ends the walk
     HTREEITEM found = nullptr;
     for (HTREEITEM child = matched ? GetChildItem(matched) : GetRootItem(); child && !found; child = GetNextSiblingItem(child))
-      if (_stricmp(GetItemText(child).c_str(), component.c_str()) == 0) found = child;
+      if (SameLabel(GetItemText(child), component)) found = child;
     if (!found) return;
     Expand(found, TVE_EXPAND);
     matched = found;
-    start = end + 1;
   }
   m_hStartItem = matched;
 }

@@ -59,6 +59,8 @@ int RunLumvex() {
   g_szStartShellPath[0] = '\0';
   const std::string startFolder = ToAnsi(folder);
   if (!startFolder.empty()) MakeStartShellPath(startFolder.c_str(), g_szStartShellPath, sizeof g_szStartShellPath);
+  CopyAnsiCut(startFolder.size() < sizeof g_szStartFolder ? startFolder : std::string(), g_szStartFolder,
+              sizeof g_szStartFolder);
 
   auto *app = dynamic_cast<CMdiMixin *>(fw::AfxGetApp());
   CDialogRun dialog;

@@ -11,4 +11,9 @@ struct PathParts {
   std::string extension;  // from the last "." on, or empty
 };
 
-PathParts SplitPath(const std::string &path);
+// Steps from a character of narrow text to the next one. Null steps one byte, which is right
+// for single-byte code pages; a double-byte one needs the system's step, or the second byte
+// of a character can be taken for a "\".
+using CharacterStep = const char *(*)(const char *);
+
+PathParts SplitPath(const std::string &path, CharacterStep next = nullptr);

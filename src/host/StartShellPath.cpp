@@ -67,7 +67,7 @@ void MakeStartShellPath(const char *folder, char *out, size_t capacity) {
   names.drives = SpecialFolderName(owner, desktop.get(), CSIDL_DRIVES);
   names.network = SpecialFolderName(owner, desktop.get(), CSIDL_NETWORK);
 
-  const PathParts parts = SplitPath(folder ? folder : "");
+  const PathParts parts = SplitAnsiPath(folder ? folder : "");
   const std::string driveName = parts.drive.empty() ? std::string() : DriveRootDisplayName(parts.drive);
   const std::string path = ComposeStartShellPath(names, driveName, parts.directory);
   if (path.size() < capacity) path.copy(out, path.size()), out[path.size()] = '\0';

@@ -46,3 +46,7 @@ void CopyAnsiCut(const std::string &text, char *buffer, size_t capacity) {
   text.copy(buffer, length);
   buffer[length] = '\0';
 }
+
+PathParts SplitAnsiPath(const std::string &path) {
+  return SplitPath(path, [](const char *at) -> const char * { return CharNextA(at); });
+}

@@ -1,6 +1,8 @@
 // Text crosses between the host's wide text and the module's narrow ANSI text here.
 #pragma once
 
+#include "host/SplitPath.h"
+
 #include <cstddef>
 #include <string>
 
@@ -12,3 +14,5 @@ std::wstring ToWide(const char *text);
 // Copies as much of the text as fits the buffer with its terminator, never splitting a
 // double-byte character.
 void CopyAnsiCut(const std::string &text, char *buffer, size_t capacity);
+// Splits a path of ANSI text by its characters, double-byte ones included.
+PathParts SplitAnsiPath(const std::string &path);

@@ -33,4 +33,7 @@ class CDialogSetLa : public fw::CDialog {
   void OnUseCurrentLayer();
   bool UsesCurrentLayer() const;
   void EnableLayer(bool enable);
+  void RemoveSettings();
+
+  bool m_bLoaded = false;  // the settings file was read when the dialog opened
 };

@@ -16,7 +16,7 @@ const char kNoSectionError[] = "Unable to locate specified key.";
 const char kNoEntryError[] = "Unable to locate specified value.";
 
 // A line must fit 2048 bytes with its terminator: 2047 characters at most.
-const std::string::size_type kLineBudget = 2048;
+const std::string::size_type kLineBudget = CIniFile::kLongestLine + 1;
 
 struct FileCloser {
   void operator()(std::FILE *file) const { std::fclose(file); }
@@ -25,9 +25,17 @@ using FilePtr = std::unique_ptr<std::FILE, FileCloser>;
 
 enum class LineRead { Line, End, TooLong };
 
+// Passes over the rest of a line that is too long to keep, its line end included.
+void SkipRestOfLine(std::FILE *file) {
+  int c;
+  while ((c = std::getc(file)) != EOF && c != '\n') {
+  }
+}
+
 // Reads the next line without its line end. The file is opened in binary mode and a
 // CR directly before the LF is dropped here, so Windows and Linux read alike. A line
-// is taken as its bytes: an embedded NUL is kept like any other character.
+// is taken as its bytes: an embedded NUL is kept like any other character. A line too
+// long to keep is read to its end, so that the next read starts at the next line.
 LineRead ReadLine(std::FILE *file, std::string &line) {
   line.clear();
   int c;
@@ -38,7 +46,10 @@ LineRead ReadLine(std::FILE *file, std::string &line) {
     }
     // A full budget before the line end means 2048 characters or more, even if
     // the last byte turns out to be a CR before the LF.
-    if (line.size() == kLineBudget) return LineRead::TooLong;
+    if (line.size() == kLineBudget) {
+      SkipRestOfLine(file);
+      return LineRead::TooLong;
+    }
     line.push_back(static_cast<char>(c));
   }
   // A failed read must not pass a cut line off as a whole one.
@@ -89,7 +100,10 @@ bool CIniFile::Load() {
   std::string currentSection;
   std::string line;
   line.reserve(kLineBudget);
-  while (ReadLine(file.get(), line) == LineRead::Line) ParseLine(line, currentSection);
+  // A line too long to keep is left out, and the lines after it still count: a file edited
+  // by hand loses no setting that follows such a line.
+  for (LineRead read; (read = ReadLine(file.get(), line)) != LineRead::End;)
+    if (read == LineRead::Line) ParseLine(line, currentSection);
   return true;
 }
 
@@ -130,7 +144,7 @@ std::string CIniFile::Serialize() const {
   return text;
 }
 
-void CIniFile::Save() {
+bool CIniFile::Save() {
   // Writing over the file in place would leave it cut short after a crash or on a
   // full disk. The content goes to a file beside it first and replaces the old one
   // only when it is complete on the disk; any failure leaves the old file as it was.
@@ -138,14 +152,16 @@ void CIniFile::Save() {
   const std::string temporary = m_path + ".tmp";
 
   FilePtr file(std::fopen(temporary.c_str(), "wb"));
-  if (!file) return;
+  if (!file) return false;
 
   bool complete = std::fwrite(content.data(), 1, content.size(), file.get()) == content.size();
   complete = std::fflush(file.get()) == 0 && complete;
   complete = complete && CommitFileToDisk(file.get());
   complete = std::fclose(file.release()) == 0 && complete;
 
-  if (!complete || !ReplaceFileAtomically(temporary, m_path)) std::remove(temporary.c_str());
+  if (complete && ReplaceFileAtomically(temporary, m_path)) return true;
+  std::remove(temporary.c_str());
+  return false;
 }
 
 std::string CIniFile::GetString(std::string section, std::string name) {

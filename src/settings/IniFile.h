@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <string>
 #include <vector>
 
@@ -13,12 +14,16 @@ class CIniFile {
     std::vector<std::string> names;
   };
 
+  // The longest line the loader keeps, in bytes; longer lines are left out.
+  static constexpr std::size_t kLongestLine = 2047;
+
   CIniFile();
   virtual ~CIniFile();
 
   void SetFilePath(std::string path);
   bool Load();
-  void Save();
+  // False when the file could not be written; it is then left as it was.
+  bool Save();
 
   std::string GetString(std::string section, std::string name);
   bool SetString(std::string section, std::string name, std::string value, bool create);

@@ -39,6 +39,7 @@ void CStaticColor::FillClient(HDC dc) const {
 
 void CStaticColor::ChooseColor() {
   if (!acedSetColorDialog(m_colorIndex, false, 0)) return;
+  m_bChosen = true;
   m_rgb = acedGetRGB(m_colorIndex);
   RedrawWindow(m_hWnd, nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_UPDATENOW);
 }

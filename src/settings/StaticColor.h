@@ -12,6 +12,8 @@ class CStaticColor : public fw::CStatic {
   // Shows the host's colour of `index`; the control is not redrawn.
   void SetColorIndex(int index);
   int GetColorIndex() const { return m_colorIndex; }
+  // Whether the person chose a colour in the host's colour dialog.
+  bool WasChosen() const { return m_bChosen; }
 
   // The colour of a layer of the host's current drawing; false when there is no such layer.
   static bool GetLayerColor(const std::string &layer, AcCmColor &color);
@@ -27,4 +29,6 @@ class CStaticColor : public fw::CStatic {
  private:
   void FillClient(HDC dc) const;
   void ChooseColor();
+
+  bool m_bChosen = false;
 };

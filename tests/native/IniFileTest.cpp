@@ -128,15 +128,17 @@ TEST_F(IniFileTest, LoadFailures) {
   EXPECT_EQ(ini.SectionCount(), 0);
 }
 
-TEST_F(IniFileTest, LongLineEndsTheReading) {
-  CIniFile ini = LoadBytes("[A]\r\nx=1\r\n" + std::string(3000, 'y') + "\r\nz=2\r\n");
-  EXPECT_EQ(ini.EntryCount("A"), 1);
+TEST_F(IniFileTest, ALineTooLongIsLeftOutAndTheLinesAfterItAreRead) {
+  CIniFile ini = LoadBytes("[A]\r\nx=1\r\nc=" + std::string(3000, 'y') + "\r\nz=2\r\n[B]\r\nkept=1\r\n");
+  EXPECT_EQ(ini.EntryCount("A"), 2);
   EXPECT_EQ(ini.GetString("A", "x"), "1");
+  EXPECT_EQ(ini.GetString("A", "z"), "2");
+  EXPECT_EQ(ini.GetString("B", "kept"), "1");
 
   // 2047 characters is the longest line kept, whatever its line end.
   const std::string longest = "v=" + std::string(2045, 'w');
   for (const auto &[bytes, entries] : {std::pair{longest + "\r\nlast=1", 2}, {longest + "\nlast=1", 2}, {longest, 1},
-                                       {"a=1\n" + longest + "w\r\nlast=1", 1}, {"a=1\n" + longest + "w", 1}})
+                                       {"a=1\n" + longest + "w\r\nlast=1", 2}, {"a=1\n" + longest + "w", 1}})
     EXPECT_EQ(LoadBytes(bytes).EntryCount(""), entries) << bytes.size();
 }
 
@@ -159,13 +161,14 @@ TEST_F(IniFileTest, SaveReplacesTheWholeFileOrNothing) {
   CIniFile ini;
   ini.SetString("A", "b", "c", true);
   EXPECT_EQ(SaveBytes(ini), "[A]\r\nb=c\r\n\r\n");
+  EXPECT_TRUE(ini.Save());
   EXPECT_FALSE(fs::exists(m_file + ".tmp"));
 
   // The temporary file cannot be created: the old file stays as it was.
   const std::string old = "[Old]\r\nkeep=1\r\n\r\n";
   Write(old);
   fs::create_directory(m_file + ".tmp");
-  ini.Save();
+  EXPECT_FALSE(ini.Save()) << "a failed save says so";
   EXPECT_EQ(Read(), old);
   fs::remove(m_file + ".tmp");
 
@@ -173,7 +176,7 @@ TEST_F(IniFileTest, SaveReplacesTheWholeFileOrNothing) {
   const fs::path folderTarget = m_folder / "folder.ini";
   fs::create_directories(folderTarget / "inside");
   ini.SetFilePath(folderTarget.string());
-  ini.Save();
+  EXPECT_FALSE(ini.Save());
   EXPECT_TRUE(fs::is_directory(folderTarget / "inside"));
   EXPECT_FALSE(fs::exists(folderTarget.string() + ".tmp"));
 }

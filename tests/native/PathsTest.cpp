@@ -34,6 +34,25 @@ TEST(SplitPath, PartsAsTheRunTimeSplitsThem) {
   }
 }
 
+// Code page 932: "\x95\x5c" is one character whose second byte is the code of a backslash.
+TEST(SplitPath, DoubleByteCharactersAreNeverTakenApart) {
+  const CharacterStep shiftJis = [](const char *at) -> const char * {
+    const unsigned char lead = static_cast<unsigned char>(*at);
+    return at + ((lead >= 0x81 && lead <= 0x9F) || (lead >= 0xE0 && lead <= 0xFC) ? (at[1] ? 2 : 1) : 1);
+  };
+  const struct {
+    const char *path, *directory, *baseName;
+  } rows[] = {{"C:\\x\\\x95\x5c", "\\x\\", "\x95\x5c"},
+              {"C:\\\x95\x5c\\\x95\x5cy.dwg", "\\\x95\x5c\\", "\x95\x5cy"},
+              {"\x95\x5c.dwg", "", "\x95\x5c"},
+              {"C:\\x\\\x95", "\\x\\", "\x95"}};  // a lead byte cut off at the end
+  for (const auto &row : rows) {
+    const PathParts parts = SplitPath(row.path, shiftJis);
+    EXPECT_EQ(parts.directory, row.directory) << row.path;
+    EXPECT_EQ(parts.baseName, row.baseName) << row.path;
+  }
+}
+
 TEST(StartShellPath, DriveFoldersGoThroughTheDrivesFolderOthersThroughTheNetwork) {
   const ShellFolderNames names{"Desktop", "My Computer", "My Network Places"};
   EXPECT_EQ(ComposeStartShellPath(names, " (C:)", "\\Proj\\"), "Desktop\\My Computer\\ (C:)\\Proj\\");

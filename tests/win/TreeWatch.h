@@ -4,6 +4,7 @@
 
 #include "ExplorerHarness.h"
 
+#include <algorithm>
 #include <cstring>
 #include <string>
 #include <vector>
@@ -52,20 +53,36 @@ inline HTREEITEM ChildNamed(HWND tree, HTREEITEM parent, const std::string &text
   return nullptr;
 }
 
-// Right-clicks the selected folder and chooses "&Folder settings"; the dialog, or null.
-inline HWND OpenFolderSettings(HWND tree) {
-  RECT rect{};
-  const HTREEITEM caret = TreeNext(tree, nullptr, TVGN_CARET);
-  std::memcpy(&rect, &caret, sizeof caret);  // TVM_GETITEMRECT takes the item in the rectangle
-  SendMessageA(tree, TVM_GETITEMRECT, TRUE, reinterpret_cast<LPARAM>(&rect));
-  POINT centre{(rect.left + rect.right) / 2, (rect.top + rect.bottom) / 2};
-  const LPARAM at = MAKELPARAM(centre.x, centre.y);
-  ClientToScreen(tree, &centre);
-  SetCursorPos(centre.x, centre.y);  // where the click happens, as the tree reads it
-  PostMessageA(tree, WM_RBUTTONDOWN, MK_RBUTTON, at);
-  PostMessageA(tree, WM_RBUTTONUP, 0, at);
+// Chooses "&Folder settings" once the menu shows; returns after the menu has closed and its
+// handler has run up to its dialog, if it opens one. False when no menu showed.
+inline bool ChooseFromMenu() {
   HWND menu = WaitForWindow("#32768", nullptr, 5000);
-  if (!menu) return nullptr;
+  if (!menu) return false;
   PostMessageA(menu, WM_CHAR, 'f', 0);
-  return WaitForWindow("#32770", "Folder settings", 5000);
+  for (int i = 0; i < 250 && IsWindowVisible(menu); ++i) Sleep(20);
+  return true;
+}
+
+// Right-clicks a row of the tree (the selected one by default) at `x` (by default the middle of
+// its text) and chooses "&Folder settings", as ChooseFromMenu.
+inline bool ChooseFolderSettings(HWND tree, HTREEITEM item = nullptr, int x = -1) {
+  RECT rect{};
+  if (!item) item = TreeNext(tree, nullptr, TVGN_CARET);
+  SendMessageA(tree, TVM_ENSUREVISIBLE, 0, reinterpret_cast<LPARAM>(item));  // a person clicks what is shown
+  std::memcpy(&rect, &item, sizeof item);  // TVM_GETITEMRECT takes the item in the rectangle
+  SendMessageA(tree, TVM_GETITEMRECT, TRUE, reinterpret_cast<LPARAM>(&rect));
+  RECT area{};
+  GetClientRect(tree, &area);  // a person clicks inside the tree, even on a row wider than it
+  POINT at{std::min<LONG>(x >= 0 ? x : (rect.left + rect.right) / 2, area.right - 1), (rect.top + rect.bottom) / 2};
+  const LPARAM client = MAKELPARAM(at.x, at.y);
+  ClientToScreen(tree, &at);
+  SetCursorPos(at.x, at.y);  // where the click happens, as the tree reads it
+  PostMessageA(tree, WM_RBUTTONDOWN, MK_RBUTTON, client);
+  PostMessageA(tree, WM_RBUTTONUP, 0, client);
+  return ChooseFromMenu();
+}
+
+// The folder settings dialog opened from the tree's menu, or null.
+inline HWND OpenFolderSettings(HWND tree, HTREEITEM item = nullptr, int x = -1) {
+  return ChooseFolderSettings(tree, item, x) ? WaitForWindow("#32770", "Folder settings", 5000) : nullptr;
 }

@@ -1,6 +1,6 @@
 // The loading protocol on a real tree control: the placeholder, the animation thread with its
-// tick and progress steps, the join before the children show, the children button, and no
-// second load of an item that has children.
+// tick and progress steps, the join before the children show, the children button, no second
+// load of an item that has children, and no load beside a running one or without its placeholder.
 #include "explorer/HourglassFX.h"
 #include "explorer/ProgressFX.h"
 #include "explorer/WaitingTreeCtrl.h"
@@ -8,6 +8,7 @@
 #include <gtest/gtest.h>
 
 #include <cstring>
+#include <functional>
 #include <vector>
 
 namespace {
@@ -15,14 +16,20 @@ class RecordingTree : public CWaitingTreeCtrl {
  public:
   int children = 0;
   bool fillResult = true;
+  bool refusePlaceholder = false;
+  bool redrawOn = true;
+  std::function<void()> duringFill;
   int fills = 0, waitBegins = 0, placeholders = 0;
   bool placeholderGoneDuringFill = false, threadEndedAtShow = false, handlesClosedAtShow = false;
   RECT placeholderText{};
   DWORD animationThread = 0;
 
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override {
-    if (message == TVM_INSERTITEMA && std::strcmp(reinterpret_cast<TVINSERTSTRUCTA *>(lParam)->item.pszText, "Loading...") == 0)
+    if (message == TVM_INSERTITEMA && std::strcmp(reinterpret_cast<TVINSERTSTRUCTA *>(lParam)->item.pszText, "Loading...") == 0) {
+      if (refusePlaceholder) return 0;
       ++placeholders;
+    }
+    if (message == WM_SETREDRAW) redrawOn = wParam != 0;
     if (message == WM_SETREDRAW && wParam && animationThread) {
       HANDLE thread = OpenThread(SYNCHRONIZE, FALSE, animationThread);
       threadEndedAtShow = !thread || WaitForSingleObject(thread, 0) == WAIT_OBJECT_0;
@@ -46,6 +53,7 @@ class RecordingTree : public CWaitingTreeCtrl {
       InsertItem("child", item);
       StepProgress(1);
     }
+    if (duringFill) duringFill();
     return fillResult;
   }
 };
@@ -53,6 +61,8 @@ class RecordingTree : public CWaitingTreeCtrl {
 class Tree : public CHourglassFX<CProgressFX<RecordingTree>> {
  public:
   std::vector<int> frames, fillWidths;
+  Tree() { m_bEraseIcon = 1; }
+  void UseCursor(HCURSOR cursor) { m_hCursor.Reset(cursor); }
 
  protected:
   void OnWaitTick(bool isTick, int total, int done) override {
@@ -89,6 +99,13 @@ class WaitingTree : public ::testing::Test {
     m_tree.GetItem(&query);
     return query.cChildren;
   }
+  int ItemCount(HTREEITEM parent = TVI_ROOT) const {
+    int count = 0;
+    for (HTREEITEM child = m_tree.GetChildItem(parent); child; child = m_tree.GetNextSiblingItem(child))
+      count += 1 + ItemCount(child);
+    return count;
+  }
+  bool Expanded(HTREEITEM item) const { return m_tree.GetItemState(item, TVIS_EXPANDED) & TVIS_EXPANDED; }
   void Notify(UINT code, HTREEITEM item) const {
     NMTREEVIEWA notice{};
     notice.hdr = NMHDR{m_tree.m_hWnd, 1, code};
@@ -156,5 +173,106 @@ TEST_F(WaitingTree, ChildrenButtonFollowsTheFillAndASecondExpansionLoadsNothing)
   m_tree.Expand(kept, TVE_EXPAND);
   EXPECT_EQ(ChildrenButton(kept), 1);
   EXPECT_EQ(m_tree.GetItemState(kept, TVIS_EXPANDED) & TVIS_EXPANDED, 0u);
+}
+
+// Loads start only from a prepared expansion, one at a time: numpad "*" expands nothing, an
+// expansion asked for while a load runs (the shell pumps messages) is refused, and neither a
+// stray expanded notification nor a refused placeholder deletes the tree or leaves it frozen.
+TEST_F(WaitingTree, NoLoadBesideARunningOneOrWithoutItsPlaceholder) {
+  struct Case {
+    const char *name;
+    std::function<void(Tree &tree, HTREEITEM folder, HTREEITEM other)> act;
+    int fills;
+    bool folderExpanded, otherExpanded;
+  } cases[] = {
+      {"numpad * on the selected folder",
+       [](Tree &tree, HTREEITEM folder, HTREEITEM) {
+         tree.SelectItem(folder);
+         tree.SendMessage(WM_KEYDOWN, VK_MULTIPLY, 0);
+       },
+       0, false, false},
+      {"the other folder expanded while the folder loads",
+       [](Tree &tree, HTREEITEM folder, HTREEITEM other) {
+         tree.duringFill = [&tree, other] { tree.Expand(other, TVE_EXPAND); };
+         tree.Expand(folder, TVE_EXPAND);
+       },
+       1, true, false},
+      {"an expanded notification with no expanding one before it",
+       [this](Tree &tree, HTREEITEM folder, HTREEITEM other) {
+         tree.Expand(folder, TVE_EXPAND);
+         Notify(TVN_ITEMEXPANDEDA, other);
+       },
+       1, true, false},
+      {"the placeholder cannot be inserted",
+       [](Tree &tree, HTREEITEM folder, HTREEITEM) {
+         tree.refusePlaceholder = true;
+         tree.Expand(folder, TVE_EXPAND);
+       },
+       0, false, false},
+  };
+  for (const Case &c : cases) {
+    SCOPED_TRACE(c.name);
+    m_tree.DeleteAllItems();
+    m_tree.fills = 0;
+    m_tree.children = 2;
+    m_tree.refusePlaceholder = false;
+    m_tree.duringFill = nullptr;
+    HTREEITEM folder = Folder("folder"), other = Folder("other");
+    const int before = ItemCount();
+    c.act(m_tree, folder, other);
+    EXPECT_EQ(m_tree.fills, c.fills);
+    EXPECT_EQ(ItemCount(), before + 2 * c.fills);
+    EXPECT_EQ(Expanded(folder), c.folderExpanded);
+    EXPECT_EQ(Expanded(other), c.otherExpanded);
+    EXPECT_TRUE(m_tree.redrawOn);
+    m_tree.duringFill = nullptr;
+    m_tree.refusePlaceholder = false;
+    m_tree.Expand(other, TVE_EXPAND);
+    EXPECT_TRUE(Expanded(other)) << "the next expansion loads";
+  }
+}
+
+// With no image list the hourglass has no place, and is not drawn at all. The loading effects
+// draw in the colours the tree shows: the window colour when the tree has none of its own.
+TEST_F(WaitingTree, NoHourglassWithoutItsPlaceAndTheTreesColours) {
+  m_tree.SetImageList(nullptr, TVSIL_NORMAL);
+  m_tree.UseCursor(static_cast<HCURSOR>(LoadImageA(nullptr, MAKEINTRESOURCEA(32512), IMAGE_CURSOR, 0, 0, LR_DEFAULTSIZE)));
+  HTREEITEM unmeasured = Folder("unmeasured");
+  m_tree.UpdateWindow();
+  RECT row{};
+  m_tree.GetItemRect(unmeasured, &row, FALSE);
+  auto corner = [&] {  // where an hourglass at no place would go, over the first item's row
+    std::vector<COLORREF> pixels;
+    const HDC dc = GetDC(m_tree.m_hWnd);
+    for (int y = 0; y < row.bottom; ++y)
+      for (int x = 0; x < GetSystemMetrics(SM_CXICON); ++x) pixels.push_back(GetPixel(dc, x, y));
+    ReleaseDC(m_tree.m_hWnd, dc);
+    return pixels;
+  };
+  const std::vector<COLORREF> before = corner();
+  std::vector<COLORREF> during;
+  m_tree.children = 8;  // 480 ms: several ticks
+  m_tree.duringFill = [&] { during = corner(); };
+  m_tree.Expand(unmeasured, TVE_EXPAND);
+  EXPECT_GE(m_tree.frames.size(), 2u);
+  EXPECT_TRUE(during == before) << "nothing drawn over the first item";
+
+  // A cursor that is all transparent: the hourglass shows its background brush alone.
+  const std::vector<BYTE> clear(32 * 32 / 8, 0xFF), none(32 * 32 / 8, 0x00);
+  m_tree.UseCursor(CreateCursor(nullptr, 0, 0, 32, 32, clear.data(), none.data()));
+  m_tree.SetImageList(m_images, TVSIL_NORMAL);
+  const int element = COLOR_WINDOW;
+  const COLORREF window = GetSysColor(COLOR_WINDOW), theme = RGB(40, 60, 80);
+  SetSysColors(1, &element, &theme);
+  COLORREF erased = CLR_INVALID;
+  m_tree.children = 4;
+  m_tree.duringFill = [&] {
+    const HDC dc = GetDC(m_tree.m_hWnd);
+    erased = GetPixel(dc, m_tree.IconRect().left, m_tree.IconRect().top);
+    ReleaseDC(m_tree.m_hWnd, dc);
+  };
+  m_tree.Expand(Folder("folder"), TVE_EXPAND);
+  SetSysColors(1, &element, &window);
+  EXPECT_EQ(erased, theme) << "the icon's place erased, and the hourglass drawn, in the window colour";
 }
 }  // namespace
