@@ -59,6 +59,17 @@ BOOL CStaticColor::OnChildNotify(UINT message, WPARAM wParam, LPARAM, LRESULT *r
 }
 
 LRESULT CStaticColor::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+  switch (message) {
+    // Reached with Tab like a button (a plain static is passed over), and Space opens the
+    // colour dialog as a click does.
+    case WM_GETDLGCODE: return DLGC_WANTCHARS;
+    case WM_CHAR:
+      if (wParam == ' ') ChooseColor();
+      return 0;
+    case WM_SETFOCUS:
+    case WM_KILLFOCUS: ::InvalidateRect(m_hWnd, nullptr, TRUE); return 0;
+    default: break;
+  }
   if (message == WM_PAINT) {
     // A white-rectangle static paints white over whatever its colour handling drew: the swatch
     // paints itself through that handling alone.
@@ -66,6 +77,12 @@ LRESULT CStaticColor::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
     HDC dc = BeginPaint(m_hWnd, &paint);
     LRESULT ignored = 0;
     OnChildNotify(WM_CTLCOLORSTATIC, reinterpret_cast<WPARAM>(dc), reinterpret_cast<LPARAM>(m_hWnd), &ignored);
+    if (::GetFocus() == m_hWnd) {
+      RECT inside;
+      ::GetClientRect(m_hWnd, &inside);
+      InflateRect(&inside, -2, -2);
+      DrawFocusRect(dc, &inside);
+    }
     EndPaint(m_hWnd, &paint);
     return 0;
   }

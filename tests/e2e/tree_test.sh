@@ -90,14 +90,16 @@ window frame 'Details$'
 placed "$frame" 1000 700
 must "the next browse opens at the remembered folder" "$plans\\Details" "$(title "$frame")"
 settings
-keys "$dialog" alt+u shift+Tab
+# From the keyboard alone: the check box, then Tab to the layer, the colour swatch (Space opens
+# the colour dialog) and the command.
+keys "$dialog" alt+u Tab
 xdotool type --delay 80 WALLS
-keys "$dialog" Tab Tab
-xdotool type --delay 80 MYCMD
-locate swatch control 'Folder settings' 200
-xdotool mousemove $(middle "$swatch") click 1
+keys "$dialog" Tab space
 window colors '^Select Color$'
 keys "$colors" 1 Return
+until_true 10 eval '! shown "^Select Color$"' || stop "waiting for the colour dialog to close"
+keys "$dialog" Tab
+xdotool type --delay 80 MYCMD
 keys "$dialog" Return
 saved_as() { [ "$(tr -d '\r' <"$ini" 2>/dev/null | xargs)" == "$1" ]; }
 expected_ini="[Default Parameters] Layer=WALLS Lisp command=MYCMD Color=1"

@@ -151,27 +151,6 @@ std::vector<Control> Controls(int id, std::wstring &title) {
   return controls;
 }
 
-std::ostream &operator<<(std::ostream &out, const Control &c) {
-  return out << c.id << " " << std::string(c.windowClass.begin(), c.windowClass.end()) << " "
-             << std::string(c.text.begin(), c.text.end());
-}
-
-TEST(Dialogs, FolderSettingsControlsInTheirOrder) {
-  std::wstring title;
-  const std::vector<Control> controls = Controls(136, title);
-  EXPECT_EQ(title, L"Folder settings");
-  const std::vector<Control> expected = {
-      {1, L"Button", L"&Accept", 0},         {2, L"Button", L"&Cancel", 0},
-      {-1, L"Static", L"Layer name :", 0},   {1017, L"Edit", L"", 0},
-      {1081, L"Button", L"&Use current layer", 0}, {200, L"Static", L"", 0},
-      {201, L"Edit", L"", 0},                {-1, L"Static", L"Lisp command:", 0},
-  };
-  ASSERT_EQ(controls, expected);
-  EXPECT_EQ(controls[0].style & 0xF, static_cast<DWORD>(BS_DEFPUSHBUTTON));
-  EXPECT_EQ(controls[4].style & 0xF, static_cast<DWORD>(BS_AUTOCHECKBOX));
-  EXPECT_TRUE(controls[5].style & SS_NOTIFY) << "the swatch reports clicks";
-}
-
 TEST(Dialogs, AboutBoxShowsTheIconTheModuleNameAndAWayToCloseAndTheIconsAndCursorLoad) {
   std::wstring title;
   bool icon = false, name = false, ok = false;

@@ -1,5 +1,6 @@
-// Every text of the module's dialogs fits its control at the dialog's own font, as the platform
-// draws it, and the about box names the release.
+// The module's dialogs as a person meets them: every text fits its control at the dialog's own
+// font, as the platform draws it; Tab walks the folder settings in the order of their layout;
+// the about box names the release.
 #include <windows.h>
 
 #include <gtest/gtest.h>
@@ -69,7 +70,7 @@ int TextRoom(HWND control) {
   }
 }
 
-TEST(DialogTexts, EveryTextFitsItsControlAtTheDialogFont) {
+TEST(Dialogs, EveryTextFitsItsControlAtTheDialogFont) {
   for (int id : {IDD_ABOUTBOX, IDD_FOLDER_SETTINGS}) {
     DialogWindow dialog(id);
     ASSERT_TRUE(dialog.hwnd) << "dialog " << id;
@@ -95,12 +96,25 @@ TEST(DialogTexts, EveryTextFitsItsControlAtTheDialogFont) {
   }
 }
 
-TEST(DialogTexts, TheAboutBoxNamesTheRelease) {
+TEST(Dialogs, TheAboutBoxNamesTheRelease) {
   DialogWindow about(IDD_ABOUTBOX);
   ASSERT_TRUE(about.hwnd);
   std::vector<std::wstring> texts;
   for (HWND control : Children(about.hwnd)) texts.push_back(TextOf(control));
   EXPECT_NE(std::find(texts.begin(), texts.end(), L"Version " LUMVEX_VERSION_WIDE), texts.end());
+}
+
+TEST(Dialogs, TabWalksTheFolderSettingsInTheOrderOfTheirLayoutFromTheCheckBox) {
+  DialogWindow settings(IDD_FOLDER_SETTINGS);
+  ASSERT_TRUE(settings.hwnd);
+  std::vector<int> order;
+  HWND first = GetNextDlgTabItem(settings.hwnd, nullptr, FALSE);
+  for (HWND at = first; at && order.size() < 10; at = GetNextDlgTabItem(settings.hwnd, at, FALSE)) {
+    order.push_back(GetDlgCtrlID(at));
+    if (GetNextDlgTabItem(settings.hwnd, at, FALSE) == first) break;
+  }
+  EXPECT_EQ(order, (std::vector<int>{IDC_USE_CURRENT_LAYER, IDC_LAYER_NAME, IDC_COLOR_SWATCH, IDC_LISP_COMMAND, IDOK, IDCANCEL}));
+  EXPECT_EQ(SendDlgItemMessageW(settings.hwnd, IDOK, WM_GETDLGCODE, 0, 0) & DLGC_DEFPUSHBUTTON, DLGC_DEFPUSHBUTTON);
 }
 
 }  // namespace
