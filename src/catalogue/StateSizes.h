@@ -14,9 +14,9 @@ constexpr int kDefaultSplitterSize = 100;
 
 struct StateSizes {
   int splitterSize = kDefaultSplitterSize;
-  int windowWidth = 0;    // 0: the frame keeps the size it was created with
+  int windowWidth = 0;  // 0: the frame keeps the size it was created with
   int windowHeight = 0;
-  int pictureWidth = 0;   // 0: the view keeps its default picture size
+  int pictureWidth = 0;  // 0: the view keeps its default picture size
   int pictureHeight = 0;
 };
 

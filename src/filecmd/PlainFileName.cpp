@@ -30,8 +30,7 @@ std::string NameRuleText(NameRule rule) {
   switch (rule) {
     case NameRule::Plain: return std::string();
     case NameRule::Empty: return "The new name is empty.";
-    case NameRule::PathSeparator:
-      return "A new name is a file name in this folder: it cannot contain \\, / or :.";
+    case NameRule::PathSeparator: return "A new name is a file name in this folder: it cannot contain \\, / or :.";
     case NameRule::ForbiddenCharacter: return "A file name cannot contain control characters or any of < > \" | ? *.";
     case NameRule::EndsWithDotOrSpace: return "A file name cannot end with a dot or a space.";
     case NameRule::ReservedDevice:

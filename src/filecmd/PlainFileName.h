@@ -6,12 +6,12 @@
 #include <string>
 
 enum class NameRule {
-  Plain,               // a file name the rename may take
+  Plain,  // a file name the rename may take
   Empty,
   PathSeparator,       // \ / or :
   ForbiddenCharacter,  // a control character or one of < > " | ? *
   EndsWithDotOrSpace,
-  ReservedDevice,      // CON, PRN, AUX, NUL, COM1-COM9, LPT1-LPT9, with any extension
+  ReservedDevice,  // CON, PRN, AUX, NUL, COM1-COM9, LPT1-LPT9, with any extension
 };
 
 // The first rule the name breaks, in the order above; Plain when it breaks none.

@@ -61,9 +61,7 @@ LRESULT CEditEx::OnKeyDown(WPARAM key) {
     case VK_RETURN:
       if (CommitRename()) return 0;
       return Default();
-    case VK_ESCAPE:
-      EndEditing();
-      return Default();
+    case VK_ESCAPE: EndEditing(); return Default();
     default: return Default();
   }
 }

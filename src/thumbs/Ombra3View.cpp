@@ -345,8 +345,7 @@ void COmbra3View::OnKey(WPARAM key) {
 }
 
 BOOL COmbra3View::PreTranslateMessage(MSG *msg) {
-  if (msg->message == WM_KEYDOWN && m_hWnd && (msg->hwnd == m_hWnd || ::IsChild(m_hWnd, msg->hwnd)) &&
-      !MovesCaretOfRename(msg))
+  if (msg->message == WM_KEYDOWN && m_hWnd && (msg->hwnd == m_hWnd || ::IsChild(m_hWnd, msg->hwnd)) && !MovesCaretOfRename(msg))
     OnKey(msg->wParam);
   return CScrollView::PreTranslateMessage(msg);
 }

@@ -43,7 +43,8 @@ void LayOut(const StateSizes &sizes, int captionHeight, int clientWidth, int cli
   Check(total >= 0 && total <= kMaxScrollHeight);
   if (totalRows > 0) Check(total >= rowStep);
   const bool capped = static_cast<long long>(rowStep) * totalRows + remainder > kMaxScrollHeight;
-  for (const int top : {0, wantedTop % std::max(1, totalRows), std::max(0, totalRows - visibleRows), std::max(0, totalRows - 1)}) {
+  for (const int top :
+       {0, wantedTop % std::max(1, totalRows), std::max(0, totalRows - visibleRows), std::max(0, totalRows - 1)}) {
     const int position = ScrollPositionForTopRow(top, rowStep, visibleRows, totalRows, remainder);
     Check(position >= 0 && position % rowStep == 0);
     if (capped) Check(position + static_cast<long long>(rowStep) * (visibleRows + 1) <= total);
@@ -56,8 +57,8 @@ void LayOut(const StateSizes &sizes, int captionHeight, int clientWidth, int cli
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size) {
   static const ScratchFile file;
-  std::ofstream(file.path, std::ios::binary | std::ios::trunc).write(reinterpret_cast<const char *>(data),
-                                                                     static_cast<std::streamsize>(size));
+  std::ofstream(file.path, std::ios::binary | std::ios::trunc)
+      .write(reinterpret_cast<const char *>(data), static_cast<std::streamsize>(size));
   CIniFile ini;
   ini.SetFilePath(file.path);
   ini.Load();

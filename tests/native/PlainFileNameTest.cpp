@@ -5,44 +5,43 @@
 
 namespace {
 TEST(PlainFileName, EachRuleAndTheNamesItLetsThrough) {
+  using R = NameRule;
   const struct {
     const char *name;
     NameRule rule;
-  } rows[] = {{"plan2.dwg", NameRule::Plain},
-              {"Plan 2 (old).DWG", NameRule::Plain},
-              {".dwg", NameRule::Plain},
-              {"console.dwg", NameRule::Plain},  // only the device name itself is reserved
-              {"com10.dwg", NameRule::Plain},
-              {"lpt0.dwg", NameRule::Plain},
-              {"nul-a.dwg", NameRule::Plain},
-              {"", NameRule::Empty},
-              {"a/b.dwg", NameRule::PathSeparator},
-              {"..\\moved.dwg", NameRule::PathSeparator},
-              {"c:x.dwg", NameRule::PathSeparator},
-              {"x.dwg:stream", NameRule::PathSeparator},
-              {"a<b.dwg", NameRule::ForbiddenCharacter},
-              {"a>b.dwg", NameRule::ForbiddenCharacter},
-              {"say \"hi\".dwg", NameRule::ForbiddenCharacter},
-              {"a|b.dwg", NameRule::ForbiddenCharacter},
-              {"plan?.dwg", NameRule::ForbiddenCharacter},
-              {"*.dwg", NameRule::ForbiddenCharacter},
-              {"tab\there.dwg", NameRule::ForbiddenCharacter},
-              {"\x1f.dwg", NameRule::ForbiddenCharacter},
-              {"plan.dwg.", NameRule::EndsWithDotOrSpace},
-              {"plan.dwg ", NameRule::EndsWithDotOrSpace},
-              {"..", NameRule::EndsWithDotOrSpace},
-              {"con.dwg", NameRule::ReservedDevice},
-              {"CON", NameRule::ReservedDevice},
-              {"Nul.tar.gz", NameRule::ReservedDevice},
-              {"aux .dwg", NameRule::ReservedDevice},
-              {"prn.txt", NameRule::ReservedDevice},
-              {"com1.dwg", NameRule::ReservedDevice},
-              {"COM9", NameRule::ReservedDevice},
-              {"lpt1.dwg", NameRule::ReservedDevice},
-              {"LpT9.x", NameRule::ReservedDevice}};
+  } rows[] = {{"plan2.dwg", R::Plain},
+              {"Plan 2 (old).DWG", R::Plain},
+              {".dwg", R::Plain},
+              {"console.dwg", R::Plain},
+              {"com10.dwg", R::Plain},
+              {"nul-a.dwg", R::Plain},
+              {"", R::Empty},
+              {"a/b.dwg", R::PathSeparator},
+              {"..\\moved.dwg", R::PathSeparator},
+              {"c:x.dwg", R::PathSeparator},
+              {"x.dwg:s", R::PathSeparator},
+              {"a<b.dwg", R::ForbiddenCharacter},
+              {"a>b", R::ForbiddenCharacter},
+              {"\"q\".dwg", R::ForbiddenCharacter},
+              {"a|b", R::ForbiddenCharacter},
+              {"p?.dwg", R::ForbiddenCharacter},
+              {"*.dwg", R::ForbiddenCharacter},
+              {"t\t.dwg", R::ForbiddenCharacter},
+              {"\x1f.dwg", R::ForbiddenCharacter},
+              {"plan.dwg.", R::EndsWithDotOrSpace},
+              {"plan.dwg ", R::EndsWithDotOrSpace},
+              {"..", R::EndsWithDotOrSpace},
+              {"con.dwg", R::ReservedDevice},
+              {"CON", R::ReservedDevice},
+              {"Nul.tar.gz", R::ReservedDevice},
+              {"aux .dwg", R::ReservedDevice},
+              {"prn.txt", R::ReservedDevice},
+              {"com1.dwg", R::ReservedDevice},
+              {"COM9", R::ReservedDevice},
+              {"LpT1.x", R::ReservedDevice}};
   for (const auto &row : rows) {
     EXPECT_EQ(CheckPlainFileName(row.name), row.rule) << row.name;
-    EXPECT_EQ(NameRuleText(row.rule).empty(), row.rule == NameRule::Plain) << row.name;
+    EXPECT_EQ(NameRuleText(row.rule).empty(), row.rule == R::Plain) << row.name;
   }
 }
 }  // namespace

@@ -213,7 +213,7 @@ TEST_F(ThumbView, RowsStayFilledAcrossTheWrapAfterEndPageDownAndAColumnChange) {
   Run(
       5 * 178 + 20, 4 * 160 + 30,
       [&](HWND frame, HWND view) {
-        Post(frame, view, WM_KEYDOWN, VK_END);  // 200 rows of 5: the range is not capped
+        Post(frame, view, WM_KEYDOWN, VK_END);        // 200 rows of 5: the range is not capped
         SizeView(frame, 4 * 178 + 20, 4 * 160 + 30);  // 250 rows of 4: it is
         Sync(frame);
         top = 5 * 196 / 4;
@@ -228,8 +228,9 @@ TEST_F(ThumbView, AStateFilePictureSizeTheViewCannotShowIsNotTaken) {
   MakeDrawings(3);
   for (const auto &[stored, shown] : std::vector<std::pair<int, int>>{{-CaptionHeight(), 143}, {-20, 143}, {100000, 4096}})
     Run(
-        4 * 178 + 20, 400, [&, shown = shown](HWND, HWND view) { EXPECT_EQ(Tiles(view)[0].rect.bottom - Tiles(view)[0].rect.top, shown); },
-        173, stored);
+        4 * 178 + 20, 400,
+        [&, shown = shown](HWND, HWND view) { EXPECT_EQ(Tiles(view)[0].rect.bottom - Tiles(view)[0].rect.top, shown); }, 173,
+        stored);
 }
 
 TEST_F(ThumbView, PictureSizesStepAndKeepTheTopRowsFirstDrawing) {
@@ -389,7 +390,8 @@ std::string AnswerRefusal(const std::function<void()> &whileShown = {}) {
   const DWORD thread = GetWindowThreadProcessId(box, nullptr);
   SendMessageA(GetDlgItem(box, IDOK), BM_CLICK, 0, 0);
   // The box gone and the focus given on inside the frame before the next click.
-  GUITHREADINFO info{sizeof info};
+  GUITHREADINFO info{};
+  info.cbSize = sizeof info;
   for (int waited = 0; waited < 5000 && (IsWindow(box) || (GetGUIThreadInfo(thread, &info), !info.hwndFocus)); waited += 10)
     Sleep(10);
   return text;
@@ -411,26 +413,39 @@ TEST_F(ThumbView, ARenameGivenUpLeavesTheFileAndShowsItsName) {
 }
 
 TEST_F(ThumbView, ARenameTakesOnlyAPlainFileNameAndSaysWhichRuleARefusedOneBreaks) {
-  const std::vector<std::pair<const char *, const char *>> refused{{"", "empty"},
-                                                                   {"a/b.dwg", "cannot contain \\, / or :"},
-                                                                   {"..\\moved.dwg", "cannot contain \\, / or :"},
-                                                                   {"c:moved.dwg", "cannot contain \\, / or :"},
-                                                                   {"con.dwg", "name devices"},
-                                                                   {"NUL", "name devices"},
-                                                                   {"lpt1.txt", "name devices"},
-                                                                   {"plan.", "end with a dot or a space"},
-                                                                   {"plan.dwg ", "end with a dot or a space"},
-                                                                   {"a<b.dwg", "control characters or any of"},
-                                                                   {"why?.dwg", "control characters or any of"},
-                                                                   {"tab\t.dwg", "control characters or any of"},
-                                                                   {"c.dwg", "\"c.dwg\" is already in this folder"}};
+  const std::string outside = Folder().substr(Folder().rfind('\\') + 1) + ".dwg";  // a name no other run leaves
+  const char *separator = "cannot contain \\, / or :", *device = "name devices", *dotOrSpace = "end with a dot or a space",
+             *character = "control characters or any of";
+  const std::vector<std::pair<std::string, const char *>> refused{{"", "empty"},
+                                                                  {"a/b.dwg", separator},
+                                                                  {"..\\" + outside, separator},
+                                                                  {"c:" + outside, separator},
+                                                                  {"con.dwg", device},
+                                                                  {"NUL", device},
+                                                                  {"lpt1.txt", device},
+                                                                  {"plan.", dotOrSpace},
+                                                                  {"plan ", dotOrSpace},
+                                                                  {"a<b.dwg", character},
+                                                                  {"why?.dwg", character},
+                                                                  {"tab\t.dwg", character},
+                                                                  {"c.dwg", "\"c.dwg\" is already in this folder"},
+                                                                  {"good.dwg", nullptr}};
   for (const char *name : {"b.dwg", "c.dwg"}) m_folder.File(name, "");
   Run(4 * 178 + 20, 400, [&](HWND frame, HWND view) {
+    bool fromMenu = false;
     for (const auto &[typed, rule] : refused) {
       HWND caption = CaptionOf(view, "b.dwg");
-      StartRename(frame, caption);
-      SendMessageA(caption, WM_SETTEXT, 0, LPARAM(typed));
+      if ((fromMenu = !fromMenu)) {  // every other rename from the tile menu
+        std::thread answer = Answer({'R'});
+        Post(frame, Tiles(view)[0].hwnd, WM_RBUTTONDOWN, MK_RBUTTON);
+        answer.join();
+        Sync(frame);
+      } else {
+        StartRename(frame, caption);
+      }
+      SendMessageA(caption, WM_SETTEXT, 0, LPARAM(typed.c_str()));
       PostMessageA(caption, WM_KEYDOWN, VK_RETURN, 0);
+      if (!rule) break;
       const std::string message = AnswerRefusal();
       Sync(frame);
       EXPECT_NE(message.find("\"b.dwg\" was not renamed."), std::string::npos) << typed << ": " << message;
@@ -438,14 +453,11 @@ TEST_F(ThumbView, ARenameTakesOnlyAPlainFileNameAndSaysWhichRuleARefusedOneBreak
       EXPECT_EQ(Names(view), (std::vector<std::string>{"b.dwg", "c.dwg"})) << typed;
       EXPECT_TRUE(ReadOnly(caption)) << typed;
     }
-    HWND caption = CaptionOf(view, "b.dwg");
-    StartRename(frame, caption);
-    SendMessageA(caption, WM_SETTEXT, 0, LPARAM("good.dwg"));
-    Post(frame, caption, WM_KEYDOWN, VK_RETURN);
+    Sync(frame);
     EXPECT_EQ(Names(view), (std::vector<std::string>{"c.dwg", "good.dwg"}));
   });
   EXPECT_EQ(FilesIn(Folder()), (std::vector<std::string>{"c.dwg", "good.dwg"}));
-  EXPECT_EQ(GetFileAttributesA((Folder() + "\\..\\moved.dwg").c_str()), INVALID_FILE_ATTRIBUTES);
+  EXPECT_EQ(GetFileAttributesA((Folder() + "\\..\\" + outside).c_str()), INVALID_FILE_ATTRIBUTES);
 }
 
 TEST_F(ThumbView, TheFolderShownAnewWhileARefusalIsUpLeavesNothingBehind) {
