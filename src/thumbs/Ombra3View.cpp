@@ -90,7 +90,11 @@ void COmbra3View::UpdateScrollSizes() {
 }
 
 void COmbra3View::DestroyTileWindows() {
+  // A caption box being renamed ends its rename as it goes; the records may already be those of
+  // another folder, so the marks are not shown on tiles that are going.
+  m_bDestroyingTiles = true;
   for (int i = 0; i < m_nRingSize; ++i) m_tiles[i].DestroyWindow();
+  m_bDestroyingTiles = false;
 }
 
 void COmbra3View::BuildTiles() {
@@ -233,6 +237,7 @@ void COmbra3View::SelectAll() {
 }
 
 void COmbra3View::ShowMarks() {
+  if (m_bDestroyingTiles) return;
   for (int i = 0; i < m_nRingSize; ++i) m_tiles[i].ShowMark();
 }
 

@@ -96,6 +96,7 @@ class COmbra3View : public fw::CScrollView {
   int m_nWheelDelta = 0;
   bool m_bBuilding = false;
   bool m_bSizePending = false;
+  bool m_bDestroyingTiles = false;
   std::optional<CaptionRename> m_pendingRename;
 };
 

@@ -1,6 +1,6 @@
-// Any state file loads into sizes the thumbnail view can lay out: a positive row step, a ring of
-// tiles no larger than the client can show, a scroll range within the cap, and scroll positions
-// on the row grid and below the wrap for every top row.
+// Any state file loads into sizes within the explorer's limits that the thumbnail view can lay
+// out: a positive row step, a scroll range within the cap, and scroll positions on the row grid
+// and below the wrap for every top row.
 #include "catalogue/StateSizes.h"
 #include "settings/IniFile.h"
 #include "thumbs/RingLayout.h"
@@ -63,6 +63,11 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size
   ini.SetFilePath(file.path);
   ini.Load();
   const StateSizes sizes = ReadStateSizes(ini);
+  const auto within = [](int side, int low, int high) { return side == 0 || (side >= low && side <= high); };
+  Check(sizes.splitterSize >= 1 && sizes.splitterSize <= kMaxWindowExtent);
+  Check(within(sizes.windowWidth, 1, kMaxWindowExtent) && within(sizes.windowHeight, 1, kMaxWindowExtent));
+  Check(within(sizes.pictureWidth, kMinPictureSide, kMaxPictureSide) &&
+        within(sizes.pictureHeight, kMinPictureSide, kMaxPictureSide));
   const int wantedTop = size > 0 ? data[0] * 37 + static_cast<int>(size) : 0;
   for (const int captionHeight : {0, 20, 40})
     for (const auto &[width, height] : {std::pair{1, 1}, std::pair{800, 600}, std::pair{1600, 1000}})

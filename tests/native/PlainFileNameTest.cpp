@@ -3,45 +3,22 @@
 
 #include <gtest/gtest.h>
 
+#include <utility>
+#include <vector>
+
 namespace {
 TEST(PlainFileName, EachRuleAndTheNamesItLetsThrough) {
   using R = NameRule;
-  const struct {
-    const char *name;
-    NameRule rule;
-  } rows[] = {{"plan2.dwg", R::Plain},
-              {"Plan 2 (old).DWG", R::Plain},
-              {".dwg", R::Plain},
-              {"console.dwg", R::Plain},
-              {"com10.dwg", R::Plain},
-              {"nul-a.dwg", R::Plain},
-              {"", R::Empty},
-              {"a/b.dwg", R::PathSeparator},
-              {"..\\moved.dwg", R::PathSeparator},
-              {"c:x.dwg", R::PathSeparator},
-              {"x.dwg:s", R::PathSeparator},
-              {"a<b.dwg", R::ForbiddenCharacter},
-              {"a>b", R::ForbiddenCharacter},
-              {"\"q\".dwg", R::ForbiddenCharacter},
-              {"a|b", R::ForbiddenCharacter},
-              {"p?.dwg", R::ForbiddenCharacter},
-              {"*.dwg", R::ForbiddenCharacter},
-              {"t\t.dwg", R::ForbiddenCharacter},
-              {"\x1f.dwg", R::ForbiddenCharacter},
-              {"plan.dwg.", R::EndsWithDotOrSpace},
-              {"plan.dwg ", R::EndsWithDotOrSpace},
-              {"..", R::EndsWithDotOrSpace},
-              {"con.dwg", R::ReservedDevice},
-              {"CON", R::ReservedDevice},
-              {"Nul.tar.gz", R::ReservedDevice},
-              {"aux .dwg", R::ReservedDevice},
-              {"prn.txt", R::ReservedDevice},
-              {"com1.dwg", R::ReservedDevice},
-              {"COM9", R::ReservedDevice},
-              {"LpT1.x", R::ReservedDevice}};
-  for (const auto &row : rows) {
-    EXPECT_EQ(CheckPlainFileName(row.name), row.rule) << row.name;
-    EXPECT_EQ(NameRuleText(row.rule).empty(), row.rule == R::Plain) << row.name;
+  const std::vector<std::pair<NameRule, std::vector<const char *>>> rules{
+      {R::Plain, {"plan2.dwg", "Plan 2 (old).DWG", ".dwg", "console.dwg", "com10.dwg", "nul-a.dwg"}},
+      {R::Empty, {""}},
+      {R::PathSeparator, {"a/b.dwg", "..\\moved.dwg", "c:x.dwg", "x.dwg:s"}},
+      {R::ForbiddenCharacter, {"a<b.dwg", "a>b", "\"q\".dwg", "a|b", "p?.dwg", "*.dwg", "t\t.dwg", "\x1f.dwg"}},
+      {R::EndsWithDotOrSpace, {"plan.dwg.", "plan.dwg ", ".."}},
+      {R::ReservedDevice, {"con.dwg", "CON", "Nul.tar.gz", "aux .dwg", "prn.txt", "com1.dwg", "COM9", "LpT1.x"}}};
+  for (const auto &[rule, names] : rules) {
+    EXPECT_EQ(NameRuleText(rule).empty(), rule == R::Plain);
+    for (const char *name : names) EXPECT_EQ(CheckPlainFileName(name), rule) << name;
   }
 }
 }  // namespace
