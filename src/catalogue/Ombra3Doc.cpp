@@ -1,6 +1,7 @@
 #include "catalogue/Ombra3Doc.h"
 
 #include "catalogue/StateFilePath.h"
+#include "catalogue/StateSizes.h"
 #include "host/ModuleGlobals.h"
 
 #include <windows.h>
@@ -11,8 +12,6 @@ namespace {
 const char kCurrentPath[] = "CurrentPath";
 const char kSize[] = "Size";
 const char kView[] = "View";
-
-const int kDefaultSplitterSize = 100;
 
 // The module this code lives in: the host's handle once the module is loaded; a program that
 // links the document in directly (a test) has its own executable instead.
@@ -49,11 +48,12 @@ void COmbra3Doc::LoadState() {
   m_strPath = m_iniFile.GetString(kCurrentPath, "Path");
   m_strName = m_iniFile.GetString(kCurrentPath, "Name");
   m_strShellPath = m_iniFile.GetString(kCurrentPath, "ShellPath");
-  m_nSplitterSize = m_iniFile.GetInt(kSize, "SplitterSize");
-  m_nWindowWidth = m_iniFile.GetInt(kSize, "WindowWidth");
-  m_nWindowHeight = m_iniFile.GetInt(kSize, "WindowHeight");
-  m_nPictureWidth = m_iniFile.GetInt(kView, "PictureWidth");
-  m_nPictureHeight = m_iniFile.GetInt(kView, "PictureHeight");
+  const StateSizes sizes = ReadStateSizes(m_iniFile);
+  m_nSplitterSize = sizes.splitterSize;
+  m_nWindowWidth = sizes.windowWidth;
+  m_nWindowHeight = sizes.windowHeight;
+  m_nPictureWidth = sizes.pictureWidth;
+  m_nPictureHeight = sizes.pictureHeight;
   m_nSort = m_iniFile.GetInt(kView, "Sort");
 }
 

@@ -2,6 +2,8 @@
 
 #include "filecmd/DwgPath.h"
 #include "filecmd/FileListBlock.h"
+#include "filecmd/MarkedPaths.h"
+#include "filecmd/PlainFileName.h"
 #include "filecmd/ShellFileOp.h"
 #include "fw/OleDataObject.h"
 #include "host/TextConvert.h"
@@ -57,6 +59,11 @@ void ReportUnpastable(const std::vector<std::wstring> &paths) {
   text += L"\n\nRename them and paste again.";
   MessageBoxW(GetActiveWindow(), text.c_str(), L"Paste", MB_OK | MB_ICONWARNING);
 }
+
+void ReportRefusedName(HWND owner, const std::string &oldName, const std::string &rule) {
+  const std::string text = "\"" + oldName + "\" was not renamed. " + rule;
+  MessageBoxA(owner, text.c_str(), "Rename", MB_OK | MB_ICONWARNING);
+}
 }  // namespace
 
 bool ForFileCommands::CanPaste() {
@@ -97,6 +104,24 @@ int ForFileCommands::RenameFile(const char *from, const char *to, HWND) {
   operation.AddFile(0, from);
   operation.AddFile(1, to);
   return operation.RenameFiles();
+}
+
+int ForFileCommands::RenameInFolder(const std::string &folder, const std::string &oldName, const std::string &newName,
+                                    HWND owner) {
+  if (newName == oldName) return 0;
+  const NameRule rule = CheckPlainFileName(newName);
+  if (rule != NameRule::Plain) {
+    ReportRefusedName(owner, oldName, NameRuleText(rule));
+    return ERROR_INVALID_NAME;
+  }
+  const std::string from = FolderWithSeparator(folder) + oldName;
+  const std::string to = FolderWithSeparator(folder) + newName;
+  // Only a change of case may land on a name that exists: the file found is the one renamed.
+  if (GetFileAttributesA(to.c_str()) != INVALID_FILE_ATTRIBUTES && lstrcmpiA(oldName.c_str(), newName.c_str()) != 0) {
+    ReportRefusedName(owner, oldName, "A file named \"" + newName + "\" is already in this folder.");
+    return ERROR_ALREADY_EXISTS;
+  }
+  return RenameFile(from.c_str(), to.c_str(), owner);
 }
 
 bool ForFileCommands::IsDwgPath(const char *path) { return path && ::IsDwgPath(std::string(path)); }

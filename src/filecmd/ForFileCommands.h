@@ -4,6 +4,8 @@
 
 #include <windows.h>
 
+#include <string>
+
 class ForFileCommands {
  public:
   virtual ~ForFileCommands() = default;
@@ -16,5 +18,9 @@ class ForFileCommands {
   bool Paste();
   // Renames through the shell and returns its result, 0 for success. The owner is not used.
   int RenameFile(const char *from, const char *to, HWND owner);
+  // Renames the drawing oldName of folder to newName, which must be a plain file name that
+  // names no other file; otherwise a message owned by owner says which rule the name breaks,
+  // and nothing is touched. 0 when renamed (or the name is unchanged).
+  int RenameInFolder(const std::string &folder, const std::string &oldName, const std::string &newName, HWND owner);
   static bool IsDwgPath(const char *path);
 };

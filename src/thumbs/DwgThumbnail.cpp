@@ -49,6 +49,8 @@ void exCDwgThumbnail::CreateCaption(const RECT &rect, fw::CWnd *parent) {
   const int edgeX = GetSystemMetrics(SM_CXEDGE);
   const int edgeY = GetSystemMetrics(SM_CYEDGE);
   const RECT caption{rect.left + edgeX, rect.bottom + edgeY, rect.right - edgeX, rect.bottom + g_nCaptionHeight - edgeY};
+  // The slot's object may have served another drawing: its box starts clean.
+  m_editCaption.Reset(m_strFileName);
   if (!m_editCaption.Create(WS_CHILD | ES_READONLY | ES_NOHIDESEL | ES_AUTOHSCROLL, caption, parent, 0)) return;
   m_editCaption.SetWindowText(m_strFileName);
   if (Record().IsSelected()) m_editCaption.SelectCaption();
@@ -66,6 +68,14 @@ void exCDwgThumbnail::UnselectTile() {
   if (!m_editCaption.m_hWnd) return;
   m_editCaption.UnselectCaption();
   Record().Deselect();
+}
+
+void exCDwgThumbnail::ShowMark() {
+  if (!m_editCaption.m_hWnd || m_editCaption.m_bEditing) return;
+  if (Record().IsSelected())
+    m_editCaption.SelectCaption();
+  else
+    m_editCaption.UnselectCaption();
 }
 
 DwgData &exCDwgThumbnail::Record() const { return (*g_pCatalogue)[m_nIndex]; }

@@ -25,6 +25,9 @@ class exCDwgThumbnail : public CDwgThumbnail {
   // Destroys the caption box, the tile's tool and the tile window; harmless without a window.
   BOOL DestroyWindow();
   void UnselectTile();
+  // The caption highlighted exactly when the record is marked (a caption being renamed keeps
+  // its own selection).
+  void ShowMark();
 
   BOOL PreTranslateMessage(MSG *msg) override;
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;

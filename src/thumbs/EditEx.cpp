@@ -19,46 +19,49 @@ void DrawSunkenEdge(HWND box, HDC dc, int dx, int dy) {
 
 CEditEx::~CEditEx() { g_pFocusedEdit = nullptr; }
 
+void CEditEx::Reset(const std::string &name) {
+  m_bEditing = false;
+  m_strSaved = name;
+}
+
 void CEditEx::StartEditing() {
   m_bEditing = true;
-  m_strSaved = GetWindowText();
+  SetWindowText(m_strSaved);
+  SelectCaption();
 }
 
 void CEditEx::SelectCaption() const { SetSel(0, LineLength(-1)); }
 
-void CEditEx::UnselectCaption() const {
-  SendMessage(WM_CLEAR);
+void CEditEx::UnselectCaption() {
+  if (m_bEditing) EndEditing();
   SetWindowText(GetWindowText());
 }
 
 void CEditEx::Redraw() const { ::RedrawWindow(m_hWnd, nullptr, nullptr, kRedrawAll); }
 
 bool CEditEx::CommitRename() {
-  if (!m_bEditing || !g_pDoc) return false;
-  const std::string folder = FolderWithSeparator(g_pDoc->m_strPath);
-  const std::string from = folder + m_strSaved;
-  const std::string to = folder + GetWindowText();
-  if (ForFileCommands().RenameFile(from.c_str(), to.c_str(), m_hWnd) != 0) {
-    SetWindowText(m_strSaved);
-    return false;
-  }
-  // The rescan rebuilds every tile, this box among them: it runs once this message is done.
-  if (g_pThumbView) g_pThumbView->PostRefreshFolder();
+  if (!m_bEditing || !g_pDoc || !g_pThumbView) return false;
+  g_pThumbView->PostRename(CaptionRename{m_hWnd, g_pDoc->m_strPath, m_strSaved, GetWindowText()});
+  m_bEditing = false;
+  SetReadOnly(TRUE);
+  Redraw();
   return true;
+}
+
+void CEditEx::EndEditing() {
+  m_bEditing = false;
+  if (!m_strSaved.empty()) SetWindowText(m_strSaved);
+  SetReadOnly(TRUE);
+  Redraw();
+  if (g_pThumbView) g_pThumbView->ShowMarks();
 }
 
 LRESULT CEditEx::OnKeyDown(WPARAM key) {
   switch (key) {
     case VK_RETURN:
-      if (m_bEditing && CommitRename()) return 0;
-      m_strSaved = GetWindowText();
-      SetReadOnly(TRUE);
+      if (CommitRename()) return 0;
       return Default();
-    case VK_ESCAPE:
-      m_bEditing = false;
-      SetWindowText(m_strSaved);
-      Redraw();
-      return Default();
+    case VK_ESCAPE: EndEditing(); return Default();
     default: return Default();
   }
 }
@@ -66,11 +69,16 @@ LRESULT CEditEx::OnKeyDown(WPARAM key) {
 void CEditEx::OnKillFocus() {
   g_pFocusedEdit = nullptr;
   Default();
-  m_bEditing = false;
-  if (!m_strSaved.empty()) SetWindowText(m_strSaved);
-  SetReadOnly(TRUE);
-  Redraw();
+  if (m_bEditing) EndEditing();
   if (g_pThumbView && g_pThumbView->m_hWnd) ::RedrawWindow(g_pThumbView->m_hWnd, nullptr, nullptr, kRedrawAll);
+}
+
+// Outside a rename a click only takes the focus: the edit's own handling would move the caret
+// and take away the highlight that shows the drawing's mark.
+LRESULT CEditEx::OnLeftButtonDown() {
+  if (m_bEditing) return Default();
+  SetFocus();
+  return 0;
 }
 
 BOOL CEditEx::OnChildNotify(UINT message, WPARAM wParam, LPARAM, LRESULT *) {
@@ -88,6 +96,7 @@ LRESULT CEditEx::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
       SelectCaption();
       return result;
     }
+    case WM_LBUTTONDOWN: return OnLeftButtonDown();
     case WM_KEYDOWN: return OnKeyDown(wParam);
     case WM_SETFOCUS: {
       const LRESULT result = Default();

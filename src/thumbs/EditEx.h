@@ -11,15 +11,20 @@ class CEditEx : public fw::CEdit {
  public:
   ~CEditEx() override;
 
+  // A box made for another drawing: no rename under way, name the one it shows.
+  void Reset(const std::string &name);
   void StartEditing();
-  // Renames the drawing from the saved name to the box's text; true when the shell did it.
+  // Hands the rename from the saved name to the box's text to the view, which carries it out
+  // once this key is done; false when no rename is under way.
   bool CommitRename();
+  // The rename given up: the saved name shown again, read-only, the marks shown again.
+  void EndEditing();
 
   // The whole text highlighted: the mark of the drawing (the box keeps it without the focus).
   void SelectCaption() const;
-  // The highlight removed (a clear changes nothing in a read-only box; setting the same text
-  // again drops the selection).
-  void UnselectCaption() const;
+  // The highlight removed (setting the same text again drops the selection). A rename under
+  // way ends as Escape ends it: its text is never cleared.
+  void UnselectCaption();
   void Redraw() const;
 
   BOOL OnChildNotify(UINT message, WPARAM wParam, LPARAM lParam, LRESULT *result) override;
@@ -31,6 +36,7 @@ class CEditEx : public fw::CEdit {
  private:
   LRESULT OnKeyDown(WPARAM key);
   void OnKillFocus();
+  LRESULT OnLeftButtonDown();
 };
 
 // Sunken edge drawn along rect grown by dx and dy: the look of a box being typed into.

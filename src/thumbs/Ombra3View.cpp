@@ -16,6 +16,7 @@
 
 #include <windowsx.h>
 
+#include <algorithm>
 #include <cstdlib>
 
 COmbra3View *g_pThumbView = nullptr;
@@ -23,8 +24,8 @@ int g_nCaptionHeight = 0;
 
 namespace {
 constexpr UINT kRedrawAll = RDW_INVALIDATE | RDW_ERASE | RDW_FRAME;
-// Posted to the view: scan the folder again once the message that asked for it is done.
-constexpr UINT kRefreshFolderMessage = WM_APP + 0x10;
+// Posted to the view: carry out the rename a caption box asked for, once its key is done.
+constexpr UINT kRenameMessage = WM_APP + 0x10;
 // Ids of the background menu.
 enum : UINT { kMenuCopy = 1, kMenuPaste = 2, kMenuDelete = 3, kMenuRename = 4 };
 
@@ -90,7 +91,11 @@ void COmbra3View::UpdateScrollSizes() {
 }
 
 void COmbra3View::DestroyTileWindows() {
+  // A caption box being renamed ends its rename as it goes; the records may already be those of
+  // another folder, so the marks are not shown on tiles that are going.
+  m_bDestroyingTiles = true;
   for (int i = 0; i < m_nRingSize; ++i) m_tiles[i].DestroyWindow();
+  m_bDestroyingTiles = false;
 }
 
 void COmbra3View::BuildTiles() {
@@ -104,7 +109,7 @@ void COmbra3View::BuildTiles() {
     m_nRingRows = 0;
     UpdateScrollSizes();
   } else {
-    m_nTotalRows = (m_nRecordCount + m_nColumns - 1) / m_nColumns;
+    m_nTotalRows = RowsFor(m_nRecordCount, m_nColumns);
     UpdateScrollSizes();
     if (m_nVisibleRows > m_nTotalRows) m_nVisibleRows = m_nTotalRows;
     m_nRingRows = m_nVisibleRows + 2;
@@ -141,14 +146,17 @@ void COmbra3View::RebuildAtTopRow() {
   ShowWindow(SW_HIDE);
   DestroyTileWindows();
   const int rowStep = RowStep();
-  const long long range = CappedTotalHeight(rowStep, m_nTotalRows, ClientHeight() % rowStep);
+  const int height = ClientHeight();
   int newTop = TopRowForColumns(m_nTopRow, m_nLayoutColumns, m_nColumns, m_nRecordCount);
-  // Where every row fits there is no scroll bar to reach rows above the top one: show them all.
-  if ((m_nRecordCount + m_nColumns - 1) / m_nColumns <= ClientHeight() / rowStep) newTop = 0;
   m_nLayoutColumns = m_nColumns;
-  long long y = static_cast<long long>(rowStep) * newTop;
-  if (range > 0 && y > range) y = (y - 1) % range + 1;  // the wrap: what subtracting the range until y <= range gives
-  ScrollToPosition(POINT{0, static_cast<LONG>(y)});
+  // The range of the new column count first: the position is set within it, not the old one.
+  m_nTotalRows = RowsFor(m_nRecordCount, m_nColumns);
+  const int visibleRows = std::min(height / rowStep, m_nTotalRows);
+  // Where every row fits there is no scroll bar to reach rows above the top one: show them all.
+  if (m_nTotalRows <= height / rowStep) newTop = 0;
+  m_bBuilding = true;
+  UpdateScrollSizes();
+  ScrollToPosition(POINT{0, ScrollPositionForTopRow(newTop, rowStep, visibleRows, m_nTotalRows, height % rowStep)});
   m_nTopRow = newTop;
   BuildTiles();
   ShowWindow(SW_SHOW);
@@ -227,6 +235,12 @@ void COmbra3View::UnselectAll() {
 
 void COmbra3View::SelectAll() {
   for (int i = 0; i < g_pCatalogue->GetSize(); ++i) (*g_pCatalogue)[i].Select();
+  ShowMarks();
+}
+
+void COmbra3View::ShowMarks() {
+  if (m_bDestroyingTiles) return;
+  for (int i = 0; i < m_nRingSize; ++i) m_tiles[i].ShowMark();
 }
 
 void COmbra3View::CopySelected() {
@@ -239,7 +253,24 @@ void COmbra3View::DeleteSelected() {
 
 bool COmbra3View::PasteFiles() { return ::PasteFiles(); }
 
-void COmbra3View::PostRefreshFolder() const { PostMessage(kRefreshFolderMessage); }
+void COmbra3View::PostRename(CaptionRename rename) {
+  m_pendingRename = std::move(rename);
+  PostMessage(kRenameMessage);
+}
+
+void COmbra3View::OnRename() {
+  if (!m_pendingRename) return;
+  const CaptionRename rename = std::move(*m_pendingRename);
+  m_pendingRename.reset();
+  fw::CFrameWnd *frame = GetParentFrame();
+  // The refusal's message box and the shell run message loops of their own, in which the
+  // folder may be shown anew: the caption box is looked up by its window afterwards.
+  if (ForFileCommands().RenameInFolder(rename.folder, rename.oldName, rename.newName, frame ? frame->m_hWnd : m_hWnd) == 0) {
+    RefreshFolder();
+  } else if (auto *caption = dynamic_cast<CEditEx *>(fw::CWnd::FromHandlePermanent(rename.caption))) {
+    caption->EndEditing();
+  }
+}
 
 BOOL COmbra3View::LineDown(int x, int y, int totalHeight) {
   const int rowStep = RowStep();
@@ -370,11 +401,23 @@ void COmbra3View::MoveKeyMark(int record) {
 }
 
 BOOL COmbra3View::PreTranslateMessage(MSG *msg) {
-  // The keys of a caption box being renamed are the box's own.
-  const bool renaming = g_pFocusedEdit && !(::GetWindowLongA(g_pFocusedEdit->m_hWnd, GWL_STYLE) & ES_READONLY);
-  if (msg->message == WM_KEYDOWN && m_hWnd && !renaming && (msg->hwnd == m_hWnd || ::IsChild(m_hWnd, msg->hwnd)))
+  if (msg->message == WM_KEYDOWN && m_hWnd && (msg->hwnd == m_hWnd || ::IsChild(m_hWnd, msg->hwnd)) && !BelongsToRename(msg))
     OnKey(msg->wParam);
   return CScrollView::PreTranslateMessage(msg);
+}
+
+bool COmbra3View::BelongsToRename(const MSG *msg) {
+  const auto *caption = dynamic_cast<const CEditEx *>(fw::CWnd::FromHandlePermanent(msg->hwnd));
+  if (!caption || !caption->m_bEditing) return false;
+  switch (msg->wParam) {
+    case VK_HOME:
+    case VK_END:
+    case VK_LEFT:
+    case VK_RIGHT:
+    case VK_RETURN:
+    case VK_F2: return true;
+    default: return false;
+  }
 }
 
 void COmbra3View::OnMouseWheel(short delta) {
@@ -508,7 +551,7 @@ LRESULT COmbra3View::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
       return result;
     }
     case WM_MOUSEWHEEL: OnMouseWheel(GET_WHEEL_DELTA_WPARAM(wParam)); return 0;
-    case kRefreshFolderMessage: RefreshFolder(); return 0;
+    case kRenameMessage: OnRename(); return 0;
     default: return CScrollView::WindowProc(message, wParam, lParam);
   }
 }

@@ -10,6 +10,16 @@
 #include "thumbs/TileToolTip.h"
 
 #include <memory>
+#include <optional>
+#include <string>
+
+// A rename asked for in a caption box: the box's window, the folder, the old and the new name.
+struct CaptionRename {
+  HWND caption = nullptr;
+  std::string folder;
+  std::string oldName;
+  std::string newName;
+};
 
 class COmbra3View : public fw::CScrollView {
  public:
@@ -28,9 +38,11 @@ class COmbra3View : public fw::CScrollView {
   void CopySelected();
   void DeleteSelected();
   bool PasteFiles();
-  // Scans the folder again once the current message is done (after a rename in a caption box,
-  // whose window and object the rescan destroys).
-  void PostRefreshFolder() const;
+  // The marks of the records shown again on every caption of the ring.
+  void ShowMarks();
+  // Renames once the current message is done: the rename may refuse the name with a message,
+  // or succeed and scan the folder again, and both may destroy the caption box that asked.
+  void PostRename(CaptionRename rename);
   HWND ToolTipWindow() const { return m_toolTip.m_hWnd; }
   // The record the keyboard is on, whose tile shows a focus frame; -1 before any. A click puts
   // it on the tile clicked.
@@ -79,6 +91,10 @@ class COmbra3View : public fw::CScrollView {
   void OnMouseWheel(short delta);
   void OnBackgroundMenu(LPARAM point);
   void OnPaint();
+  void OnRename();
+  // A key of a caption box being renamed (the caret keys, Enter that commits, F2): the box's,
+  // not the view's.
+  static bool BelongsToRename(const MSG *msg);
 
   // The tile ring, held by value; its column count and size as captured when it was built.
   std::unique_ptr<exCDwgThumbnail[]> m_tiles;
@@ -88,6 +104,8 @@ class COmbra3View : public fw::CScrollView {
   int m_nWheelDelta = 0;
   bool m_bBuilding = false;
   bool m_bSizePending = false;
+  bool m_bDestroyingTiles = false;
+  std::optional<CaptionRename> m_pendingRename;
   int m_nKeyRecord = -1;
 };
 

@@ -19,6 +19,19 @@ int CappedTotalHeight(int rowStep, int rows, int remainder) {
   return kMaxScrollHeight - kMaxScrollHeight % rowStep;
 }
 
+int RowsFor(int recordCount, int columns) {
+  if (columns <= 0 || recordCount <= 0) return 0;
+  return static_cast<int>((static_cast<long long>(recordCount) + columns - 1) / columns);
+}
+
+int ScrollPositionForTopRow(int topRow, int rowStep, int visibleRows, int totalRows, int remainder) {
+  if (rowStep <= 0 || topRow <= 0) return 0;
+  const long long place = static_cast<long long>(rowStep) * topRow;
+  if (static_cast<long long>(rowStep) * totalRows + remainder <= kMaxScrollHeight) return static_cast<int>(place);
+  const long long wrap = CappedTotalHeight(rowStep, totalRows, remainder) - static_cast<long long>(rowStep) * (visibleRows + 1);
+  return wrap > 0 ? static_cast<int>(place % wrap) : 0;
+}
+
 int TopRowForColumns(int oldTopRow, int oldColumns, int newColumns, int recordCount) {
   if (newColumns <= 0) return 0;
   const long long top = static_cast<long long>(oldColumns) * oldTopRow / newColumns;

@@ -12,6 +12,15 @@ int ColumnsThatFit(int width, int gap, int colStep);
 // rowStep × rows + remainder, cut down to the largest multiple of rowStep within the cap.
 int CappedTotalHeight(int rowStep, int rows, int remainder);
 
+// Rows of `columns` that hold recordCount records.
+int RowsFor(int recordCount, int columns);
+
+// The scroll position at which the view shows topRow at the top. Within an uncapped range it is
+// topRow's own place. In the capped range the line steps cycle the position through the row
+// grid from 0 to the wrap, totalHeight − rowStep × (visibleRows + 1): the position lies on
+// that grid and below the wrap, where a line step down still meets the wrap exactly.
+int ScrollPositionForTopRow(int topRow, int rowStep, int visibleRows, int totalRows, int remainder);
+
 // The row that holds the first drawing of oldTopRow laid out in oldColumns, once laid out in
 // newColumns; never beyond recordCount.
 int TopRowForColumns(int oldTopRow, int oldColumns, int newColumns, int recordCount);

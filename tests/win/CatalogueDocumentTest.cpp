@@ -72,20 +72,20 @@ TEST_F(ExplorerState, WithoutAFileTheDefaultsAreUsedAndEveryKeyIsWrittenAtTheEnd
       << "values travel to the next call";
 }
 
-TEST_F(ExplorerState, AnExistingFileKeepsItsOrderItsOtherEntriesAndItsNumbersUncorrected) {
+TEST_F(ExplorerState, AnExistingFileKeepsItsOrderItsOtherEntriesAndItsNumbersWithinWhatCanBeShown) {
   WriteState(
       "[View]\r\nSort=7\r\nTheme=dark\r\nPictureHeight=200\r\n\r\n[Notes]\r\nowner=me\r\n\r\n"
       "[CurrentPath]\r\nName=door.dwg\r\nPath=Z:\\blocks\r\n\r\n"
       "[Size]\r\nSplitterSize=wide\r\nWindowWidth=640px\r\nWindowHeight=-3\r\n");
   {
     COmbra3Doc document;
-    EXPECT_EQ(Values(document), "Z:\\blocks|door.dwg||100|640|-3|0|200|7") << "numbers are read as plain decimals";
+    EXPECT_EQ(Values(document), "Z:\\blocks|door.dwg||100|640|0|0|200|7") << "numbers are read as plain decimals";
     document.m_strName = "window.dwg";
   }
   EXPECT_EQ(Content(StateFile()),
             "[View]\r\nSort=7\r\nTheme=dark\r\nPictureHeight=200\r\nPictureWidth=0\r\n\r\n[Notes]\r\nowner=me\r\n\r\n"
             "[CurrentPath]\r\nName=window.dwg\r\nPath=Z:\\blocks\r\nShellPath=\r\n\r\n"
-            "[Size]\r\nSplitterSize=100\r\nWindowWidth=640\r\nWindowHeight=-3\r\n\r\n");
+            "[Size]\r\nSplitterSize=100\r\nWindowWidth=640\r\nWindowHeight=0\r\n\r\n");
 }
 
 TEST_F(ExplorerState, AStateFileThatCannotBeReadOrReplacedLosesOnlyThisCall) {

@@ -16,26 +16,6 @@
 namespace {
 namespace fs = std::filesystem;
 
-// The XDG trash the shell moves deleted files to, seen through drive Z:.
-fs::path TrashFiles() {
-  std::string data;
-  if (const char *xdg = std::getenv("XDG_DATA_HOME"); xdg && *xdg) {
-    data = std::string("Z:") + xdg;
-  } else {
-    std::string home = std::getenv("WINEHOMEDIR") ? std::getenv("WINEHOMEDIR") : "";
-    if (home.rfind("\\??\\", 0) == 0) home.erase(0, 4);
-    data = home + "\\.local\\share";
-  }
-  for (char &c : data) c = c == '/' ? '\\' : c;
-  return fs::path(data) / "Trash" / "files";
-}
-
-void RemoveFromTrash(const std::string &name) {
-  std::error_code ignored;
-  fs::remove(TrashFiles() / name, ignored);
-  fs::remove(TrashFiles().parent_path() / "info" / (name + ".trashinfo"), ignored);
-}
-
 constexpr int kYes = 6;
 constexpr int kNo = 7;
 

@@ -1,8 +1,10 @@
-// A folder of its own under the temp folder for one test, removed with everything in it.
+// A folder of its own under the temp folder for one test, removed with everything in it; and
+// the trash the shell moves deleted files to.
 #pragma once
 
 #include <windows.h>
 
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
@@ -44,4 +46,24 @@ class ScratchFolder {
 inline std::string Content(const std::string &path) {
   std::ifstream in(path.c_str(), std::ios::binary);
   return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
+}
+
+// The XDG trash the shell moves deleted files to, seen through drive Z:.
+inline std::filesystem::path TrashFiles() {
+  std::string data;
+  if (const char *xdg = std::getenv("XDG_DATA_HOME"); xdg && *xdg) {
+    data = std::string("Z:") + xdg;
+  } else {
+    std::string home = std::getenv("WINEHOMEDIR") ? std::getenv("WINEHOMEDIR") : "";
+    if (home.rfind("\\??\\", 0) == 0) home.erase(0, 4);
+    data = home + "\\.local\\share";
+  }
+  for (char &c : data) c = c == '/' ? '\\' : c;
+  return std::filesystem::path(data) / "Trash" / "files";
+}
+
+inline void RemoveFromTrash(const std::string &name) {
+  std::error_code ignored;
+  std::filesystem::remove(TrashFiles() / name, ignored);
+  std::filesystem::remove(TrashFiles().parent_path() / "info" / (name + ".trashinfo"), ignored);
 }

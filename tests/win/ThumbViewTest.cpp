@@ -9,6 +9,7 @@
 
 #include <array>
 #include <cstdio>
+#include <filesystem>
 
 namespace {
 constexpr int kIncrease = 32774, kDecrease = 32775, kMarkAll = 32793, kCopy = 57634, kCancel = 32796;
@@ -182,6 +183,59 @@ TEST_F(ThumbView, TheScrollBarWrapsAtTheCappedRange) {
       100, 160 - CaptionHeight());
 }
 
+// Line steps from the top row `top` (in rows of `columns`), each followed by a look at the
+// captions: every row in view filled with the drawings that belong there, the top one at the top.
+void StepAndCheck(HWND frame, HWND view, WPARAM code, int steps, int &top, int columns, int records, int rowsInView) {
+  const int lastTop = (records + columns - 1) / columns - 1;
+  for (int i = 0; i < steps; ++i) {
+    Post(frame, view, WM_VSCROLL, code);
+    top = std::clamp(top + (code == SB_LINEDOWN ? 1 : -1), 0, lastTop);
+    ASSERT_EQ(Names(view), Drawings(top * columns, rowsInView * columns, records)) << "top row " << top;
+    const std::vector<Tile> tiles = Tiles(view);
+    ASSERT_TRUE(std::any_of(tiles.begin(), tiles.end(), [&](const Tile &t) { return t.rect.top == 0; })) << "top row " << top;
+  }
+}
+
+TEST_F(ThumbView, RowsStayFilledAcrossTheWrapAfterEndPageDownAndAColumnChange) {
+  MakeDrawings(1000);  // row step 160; a view 30 pixels more than 4 rows shows part of a fifth
+  int top = 0;
+  Run(
+      100, 4 * 160 + 30,
+      [&](HWND frame, HWND view) {
+        Post(frame, view, WM_KEYDOWN, VK_END);
+        top = 996;
+        StepAndCheck(frame, view, SB_LINEUP, 4, top, 1, 1000, 5);  // across the wrap at the first steps
+        Post(frame, view, WM_KEYDOWN, VK_HOME);
+        for (int i = 0; i < 50; ++i) Post(frame, view, WM_KEYDOWN, VK_NEXT);
+        top = 200;  // beyond the wrap of the capped range
+        ASSERT_EQ(Names(view), Drawings(200, 5, 1000));
+        StepAndCheck(frame, view, SB_LINEDOWN, 3, top, 1, 1000, 5);
+        StepAndCheck(frame, view, SB_LINEUP, 6, top, 1, 1000, 5);
+      },
+      100, 160 - CaptionHeight());
+  Run(
+      5 * 178 + 20, 4 * 160 + 30,
+      [&](HWND frame, HWND view) {
+        Post(frame, view, WM_KEYDOWN, VK_END);        // 200 rows of 5: the range is not capped
+        SizeView(frame, 4 * 178 + 20, 4 * 160 + 30);  // 250 rows of 4: it is
+        Sync(frame);
+        top = 5 * 196 / 4;
+        ASSERT_EQ(Names(view), Drawings(top * 4, 20, 1000));
+        StepAndCheck(frame, view, SB_LINEUP, 50, top, 4, 1000, 5);
+        StepAndCheck(frame, view, SB_LINEDOWN, 3, top, 4, 1000, 5);
+      },
+      173, 160 - CaptionHeight());
+}
+
+TEST_F(ThumbView, AStateFilePictureSizeTheViewCannotShowIsNotTaken) {
+  MakeDrawings(3);
+  for (const auto &[stored, shown] : std::vector<std::pair<int, int>>{{-CaptionHeight(), 143}, {-20, 143}, {100000, 4096}})
+    Run(
+        4 * 178 + 20, 400,
+        [&, shown = shown](HWND, HWND view) { EXPECT_EQ(Tiles(view)[0].rect.bottom - Tiles(view)[0].rect.top, shown); }, 173,
+        stored);
+}
+
 TEST_F(ThumbView, PictureSizesStepAndKeepTheTopRowsFirstDrawing) {
   const std::vector<std::array<int, 3>> steps{
       {kIncrease, 216, 179}, {kIncrease, 270, 224}, {kIncrease, 338, 280}, {kIncrease, 423, 350}, {kIncrease, 423, 350},
@@ -303,24 +357,214 @@ TEST_F(ThumbView, SearchFindsByPrefixAndClickingTheBoxEmptiesIt) {
   });
 }
 
-TEST_F(ThumbView, RenameInPlaceOrGiveUp) {
-  const std::vector<std::pair<const char *, WPARAM>> cases{
-      {"e.dwg", VK_RETURN}, {"e.dwg", VK_RETURN}, {"x.dwg", VK_ESCAPE}, {"x.dwg", VK_TAB}};
+// A double click on a caption box starts its rename, as a person's click, release and second click.
+void StartRename(HWND frame, HWND caption) {
+  PostMessageA(caption, WM_LBUTTONDOWN, MK_LBUTTON, 0);
+  PostMessageA(caption, WM_LBUTTONUP, 0, 0);
+  Post(frame, caption, WM_LBUTTONDBLCLK, MK_LBUTTON);
+}
+HWND CaptionOf(HWND view, const std::string &name) {
+  for (const Tile &t : Tiles(view))
+    if (t.name == name) return t.caption;
+  return nullptr;
+}
+bool ReadOnly(HWND edit) { return (GetWindowLongA(edit, GWL_STYLE) & ES_READONLY) != 0; }
+
+// The names of the files in a folder, sorted.
+std::vector<std::string> FilesIn(const std::string &folder) {
+  std::vector<std::string> names;
+  for (const auto &entry : std::filesystem::directory_iterator(folder)) names.push_back(entry.path().filename().string());
+  std::sort(names.begin(), names.end());
+  return names;
+}
+
+// The message box of a refused rename once it shows: its text; then OK is pressed.
+std::string AnswerRefusal(const std::function<void()> &whileShown = {}) {
+  HWND box = WaitForWindow("#32770", "Rename", 10000);
+  if (!box) return "(no message)";
+  if (whileShown) whileShown();
+  std::string text;
+  for (HWND child = FindWindowExA(box, nullptr, "Static", nullptr); child; child = FindWindowExA(box, child, "Static", nullptr))
+    text += WindowText(child);
+  const DWORD thread = GetWindowThreadProcessId(box, nullptr);
+  SendMessageA(GetDlgItem(box, IDOK), BM_CLICK, 0, 0);
+  // The box gone and the focus given on inside the frame before the next click.
+  GUITHREADINFO info{};
+  info.cbSize = sizeof info;
+  for (int waited = 0; waited < 5000 && (IsWindow(box) || (GetGUIThreadInfo(thread, &info), !info.hwndFocus)); waited += 10)
+    Sleep(10);
+  return text;
+}
+
+TEST_F(ThumbView, ARenameGivenUpLeavesTheFileAndShowsItsName) {
   for (const char *name : {"b.dwg", "c.dwg"}) m_folder.File(name, "");
   Run(4 * 178 + 20, 400, [&](HWND frame, HWND view) {
-    for (const auto &[typed, key] : cases) {
-      HWND caption = Tiles(view)[0].caption;  // b.dwg, then c.dwg (renaming onto e.dwg is refused)
-      PostMessageA(caption, WM_LBUTTONDOWN, MK_LBUTTON, 0);
-      PostMessageA(caption, WM_LBUTTONUP, 0, 0);
-      Post(frame, caption, WM_LBUTTONDBLCLK, MK_LBUTTON);
-      EXPECT_EQ(GetWindowLongA(caption, GWL_STYLE) & ES_READONLY, 0);
-      SendMessageA(caption, WM_SETTEXT, 0, LPARAM(typed));
+    for (const WPARAM key : {VK_ESCAPE, VK_TAB, VK_PRIOR}) {  // Page Up rebuilds every tile
+      HWND caption = Tiles(view)[0].caption;
+      StartRename(frame, caption);
+      EXPECT_FALSE(ReadOnly(caption));
+      SendMessageA(caption, WM_SETTEXT, 0, LPARAM("x.dwg"));
       Post(frame, caption, WM_KEYDOWN, key);
-      EXPECT_EQ(Names(view), (std::vector<std::string>{"c.dwg", "e.dwg"})) << key;
+      EXPECT_EQ(Names(view), (std::vector<std::string>{"b.dwg", "c.dwg"})) << key;
     }
   });
-  EXPECT_EQ(GetFileAttributesA(m_folder.File("b.dwg").c_str()), INVALID_FILE_ATTRIBUTES);
-  EXPECT_EQ(GetFileAttributesA(m_folder.File("x.dwg").c_str()), INVALID_FILE_ATTRIBUTES);
+  EXPECT_EQ(FilesIn(Folder()), (std::vector<std::string>{"b.dwg", "c.dwg"}));
+}
+
+TEST_F(ThumbView, ARenameTakesOnlyAPlainFileNameAndSaysWhichRuleARefusedOneBreaks) {
+  const std::string outside = Folder().substr(Folder().rfind('\\') + 1) + ".dwg";  // a name no other run leaves
+  const char *separator = "cannot contain \\, / or :", *device = "name devices", *dotOrSpace = "end with a dot or a space",
+             *character = "control characters or any of";
+  const std::vector<std::pair<std::string, const char *>> refused{{"", "empty"},
+                                                                  {"a/b.dwg", separator},
+                                                                  {"..\\" + outside, separator},
+                                                                  {"c:" + outside, separator},
+                                                                  {"con.dwg", device},
+                                                                  {"NUL", device},
+                                                                  {"lpt1.txt", device},
+                                                                  {"plan.", dotOrSpace},
+                                                                  {"plan ", dotOrSpace},
+                                                                  {"a<b.dwg", character},
+                                                                  {"why?.dwg", character},
+                                                                  {"tab\t.dwg", character},
+                                                                  {"c.dwg", "\"c.dwg\" is already in this folder"},
+                                                                  {"good.dwg", nullptr}};
+  for (const char *name : {"b.dwg", "c.dwg"}) m_folder.File(name, "");
+  Run(4 * 178 + 20, 400, [&](HWND frame, HWND view) {
+    bool fromMenu = false;
+    for (const auto &[typed, rule] : refused) {
+      HWND caption = CaptionOf(view, "b.dwg");
+      if ((fromMenu = !fromMenu)) {  // every other rename from the tile menu
+        std::thread answer = Answer({'R'});
+        Post(frame, Tiles(view)[0].hwnd, WM_RBUTTONDOWN, MK_RBUTTON);
+        answer.join();
+        Sync(frame);
+      } else {
+        StartRename(frame, caption);
+      }
+      SendMessageA(caption, WM_SETTEXT, 0, LPARAM(typed.c_str()));
+      PostMessageA(caption, WM_KEYDOWN, VK_RETURN, 0);
+      if (!rule) break;
+      const std::string message = AnswerRefusal();
+      Sync(frame);
+      EXPECT_NE(message.find("\"b.dwg\" was not renamed."), std::string::npos) << typed << ": " << message;
+      EXPECT_NE(message.find(rule), std::string::npos) << typed << ": " << message;
+      EXPECT_EQ(Names(view), (std::vector<std::string>{"b.dwg", "c.dwg"})) << typed;
+      EXPECT_TRUE(ReadOnly(caption)) << typed;
+    }
+    Sync(frame);
+    EXPECT_EQ(Names(view), (std::vector<std::string>{"c.dwg", "good.dwg"}));
+  });
+  EXPECT_EQ(FilesIn(Folder()), (std::vector<std::string>{"c.dwg", "good.dwg"}));
+  EXPECT_EQ(GetFileAttributesA((Folder() + "\\..\\" + outside).c_str()), INVALID_FILE_ATTRIBUTES);
+}
+
+TEST_F(ThumbView, TheFolderShownAnewWhileARefusalIsUpLeavesNothingBehind) {
+  constexpr int kSortByName = 32799;
+  for (const char *name : {"b.dwg", "c.dwg"}) m_folder.File(name, "");
+  Run(4 * 178 + 20, 400, [&](HWND frame, HWND view) {
+    HWND caption = CaptionOf(view, "b.dwg");
+    StartRename(frame, caption);
+    SendMessageA(caption, WM_SETTEXT, 0, LPARAM("c.dwg"));
+    PostMessageA(caption, WM_KEYDOWN, VK_RETURN, 0);
+    // Inside the message's own loop the sort command builds every tile anew.
+    AnswerRefusal([&] { SendMessageA(frame, WM_COMMAND, kSortByName, 0); });
+    Sync(frame);
+    EXPECT_FALSE(IsWindow(caption));
+    EXPECT_EQ(Names(view), (std::vector<std::string>{"b.dwg", "c.dwg"}));
+  });
+  EXPECT_EQ(FilesIn(Folder()), (std::vector<std::string>{"b.dwg", "c.dwg"}));
+}
+
+TEST_F(ThumbView, ClickingAnotherTileEndsARenameAsEscapeDoes) {
+  MakeDrawings(3);
+  const BrowseOutcome outcome = Run(
+      4 * 178 + 20, 400,
+      [&](HWND frame, HWND view) {
+        HWND caption = Tiles(view)[0].caption;
+        StartRename(frame, caption);
+        SendMessageA(caption, EM_SETSEL, 0, 4);  // "d000" of d000.dwg
+        Post(frame, Tiles(view)[1].hwnd, WM_LBUTTONDOWN, MK_LBUTTON);
+        EXPECT_EQ(WindowText(caption), "d000.dwg");
+        EXPECT_TRUE(ReadOnly(caption));
+        EXPECT_EQ(Marked(view), std::vector<int>{1});
+        // No rename is left to take the Enter: it accepts the drawing clicked, and the frame goes.
+        PostMessageA(caption, WM_KEYDOWN, VK_RETURN, 0);
+      },
+      0, 0, false);
+  const std::string chosen = Folder() + "\\d001.dwg";
+  ASSERT_FALSE(outcome.texts.empty());
+  EXPECT_EQ(outcome.texts[0], std::wstring(chosen.begin(), chosen.end()));
+  EXPECT_EQ(FilesIn(Folder()), Drawings(0, 3, 3));
+}
+
+TEST_F(ThumbView, EditingKeysMoveTheCaretOfACaptionBeingRenamedAndTheFramesKeysStayItsCommands) {
+  MakeDrawings(12);
+  Run(4 * 178 + 20, 400, [&](HWND frame, HWND view) {
+    HWND caption = Tiles(view)[4].caption;  // d004.dwg
+    StartRename(frame, caption);
+    for (const auto &[key, caret] : std::vector<std::pair<WPARAM, int>>{{VK_HOME, 0}, {VK_END, 8}, {VK_LEFT, 7}, {VK_RIGHT, 8}}) {
+      Post(frame, caption, WM_KEYDOWN, key);
+      DWORD start = 99, end = 99;
+      SendMessageA(caption, EM_GETSEL, reinterpret_cast<WPARAM>(&start), reinterpret_cast<LPARAM>(&end));
+      EXPECT_EQ(start * 100 + end, DWORD(caret * 101)) << key;
+      EXPECT_TRUE(IsWindow(caption) && !ReadOnly(caption)) << key;
+    }
+    SendMessageA(caption, EM_SETSEL, 0, 4);
+    Post(frame, caption, WM_KEYDOWN, VK_DELETE);  // the frame's Delete clears the selected text
+    EXPECT_EQ(WindowText(caption), ".dwg");
+    Post(frame, caption, WM_KEYDOWN, VK_ESCAPE);
+    EXPECT_EQ(WindowText(caption), "d004.dwg");
+  });
+  EXPECT_EQ(FilesIn(Folder()), Drawings(0, 12, 12));
+}
+
+TEST_F(ThumbView, AReusedCaptionBoxStartsClean) {
+  MakeDrawings(40);  // 4 columns, 2 visible rows: a ring of 16 slots, d016 takes the slot of d000
+  Run(4 * 178 + 20, 2 * m_step, [&](HWND frame, HWND view) {
+    HWND first = Tiles(view)[0].caption;
+    StartRename(frame, first);
+    SendMessageA(first, WM_SETTEXT, 0, LPARAM("typed.dwg"));
+    Post(frame, first, WM_KEYDOWN, VK_ESCAPE);
+    for (int i = 0; i < 3; ++i) Post(frame, view, WM_VSCROLL, SB_LINEDOWN);
+    ASSERT_EQ(Names(view), Drawings(12, 8, 40));
+    HWND reused = CaptionOf(view, "d016.dwg");
+    PostMessageA(reused, WM_LBUTTONDOWN, MK_LBUTTON, 0);
+    Post(frame, reused, WM_LBUTTONUP, 0);
+    Post(frame, view, WM_VSCROLL, SB_LINEUP);  // the view takes the focus from the caption
+    EXPECT_EQ(Names(view, false), Drawings(8, 16, 40));
+    StartRename(frame, Tiles(view)[8].caption);
+    SendMessageA(Tiles(view)[8].caption, WM_SETTEXT, 0, LPARAM("moved.dwg"));
+    Post(frame, Tiles(view)[8].caption, WM_KEYDOWN, VK_RETURN);
+  });
+  std::vector<std::string> expected = Drawings(0, 40, 40);
+  expected[16] = "moved.dwg";
+  std::sort(expected.begin(), expected.end());
+  EXPECT_EQ(FilesIn(Folder()), expected);
+}
+
+TEST_F(ThumbView, WhatIsMarkedIsVisiblyMarkedAndDeleteTakesExactlyThat) {
+  MakeDrawings(40);
+  Run(4 * 178 + 20, 2 * m_step, [&](HWND frame, HWND view) {
+    SendMessageA(frame, WM_COMMAND, kMarkAll, 0);
+    EXPECT_EQ(Marked(view).size(), Tiles(view).size()) << "every caption of the ring shows its mark";
+    Post(frame, Tiles(view)[1].hwnd, WM_LBUTTONDOWN, MK_LBUTTON);
+    Post(frame, Tiles(view)[2].hwnd, WM_LBUTTONDOWN, MK_LBUTTON | MK_CONTROL);
+    PostMessageA(Tiles(view)[2].caption, WM_LBUTTONDOWN, MK_LBUTTON, 0);
+    Post(frame, Tiles(view)[2].caption, WM_LBUTTONUP, 0);
+    EXPECT_EQ(Marked(view), (std::vector<int>{1, 2}));
+    for (const WPARAM code : {SB_LINEDOWN, SB_LINEDOWN, SB_LINEDOWN, SB_LINEDOWN, SB_LINEUP, SB_LINEUP, SB_LINEUP, SB_LINEUP})
+      Post(frame, view, WM_VSCROLL, code);
+    EXPECT_EQ(Marked(view), (std::vector<int>{1, 2}));
+    std::thread answer = Answer({'D'}, IDYES);
+    Post(frame, Tiles(view)[2].hwnd, WM_RBUTTONDOWN, MK_RBUTTON);
+    answer.join();
+    Sync(frame);
+  });
+  std::vector<std::string> kept = Drawings(0, 40, 40);
+  kept.erase(kept.begin() + 1, kept.begin() + 3);
+  EXPECT_EQ(FilesIn(Folder()), kept);
+  for (const char *name : {"d001.dwg", "d002.dwg"}) RemoveFromTrash(name);
 }
 
 TEST_F(ThumbView, TheTooltipNamesSizeAndDateOfEachTile) {
