@@ -1,6 +1,7 @@
 #include "thumbs/EditEx.h"
 
 #include "catalogue/Ombra3Doc.h"
+#include "filecmd/DrawingExtension.h"
 #include "filecmd/ForFileCommands.h"
 #include "filecmd/MarkedPaths.h"
 #include "thumbs/FocusedEdit.h"
@@ -27,8 +28,12 @@ void CEditEx::Reset(const std::string &name) {
 void CEditEx::StartEditing() {
   m_bEditing = true;
   SetWindowText(m_strSaved);
-  SelectCaption();
+  SelectName();
 }
+
+// As the shell does: the name is selected, not its extension, so that typing keeps the drawing
+// a drawing.
+void CEditEx::SelectName() const { SetSel(0, static_cast<int>(NameLengthBeforeExtension(GetWindowText()))); }
 
 void CEditEx::SelectCaption() const { SetSel(0, LineLength(-1)); }
 
@@ -41,7 +46,7 @@ void CEditEx::Redraw() const { ::RedrawWindow(m_hWnd, nullptr, nullptr, kRedrawA
 
 bool CEditEx::CommitRename() {
   if (!m_bEditing || !g_pDoc || !g_pThumbView) return false;
-  g_pThumbView->PostRename(CaptionRename{m_hWnd, g_pDoc->m_strPath, m_strSaved, GetWindowText()});
+  g_pThumbView->PostRename(CaptionRename{m_hWnd, g_pDoc->m_strPath, m_strSaved, KeepingExtension(GetWindowText(), m_strSaved)});
   m_bEditing = false;
   SetReadOnly(TRUE);
   Redraw();
@@ -93,7 +98,7 @@ LRESULT CEditEx::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
       SetReadOnly(FALSE);
       StartEditing();
       const LRESULT result = Default();
-      SelectCaption();
+      SelectName();
       return result;
     }
     case WM_LBUTTONDOWN: return OnLeftButtonDown();

@@ -22,6 +22,8 @@ class CEditEx : public fw::CEdit {
 
   // The whole text highlighted: the mark of the drawing (the box keeps it without the focus).
   void SelectCaption() const;
+  // The name before the extension highlighted, as a rename starts.
+  void SelectName() const;
   // The highlight removed (setting the same text again drops the selection). A rename under
   // way ends as Escape ends it: its text is never cleared.
   void UnselectCaption();

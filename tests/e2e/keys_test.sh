@@ -46,12 +46,12 @@ press Tab Tab shift+Tab Tab Return
 check "Tab and Shift+Tab reach the accept button, and Enter there accepts" "$(result "${names[0]}")" "$(ended)"
 
 browse ""
-press Tab Right F2
-xdotool type --delay 60 keyed.dwg
+press Tab Right F2 End shift+Home
+xdotool type --delay 60 keyed
 press Return
 renamed() { [ -e "$world/Keys/keyed.dwg" ] && [ ! -e "$world/Keys/${names[0]}" ]; }
 until_true 10 renamed
-check "F2 renames the marked drawing" "keyed.dwg" "$(ls "$world/Keys" | grep -x -e keyed.dwg -e "${names[0]}")"
+check "F2 renames the marked drawing, and a name typed without .dwg keeps it" "keyed.dwg" "$(ls "$world/Keys" | grep -x -e keyed.dwg -e "${names[0]}")"
 press Escape
 check "Escape ends the browse" nil "$(ended)"
 

@@ -56,9 +56,10 @@ grown() { locate after tile "$drive" "${names[0]}"; [ "$(cut -d' ' -f3 <<<"$afte
 until_true 10 grown
 check "larger pictures: the tiles grow" 1 "$(grown && echo 1)"
 
-# The caption under the first tile: double click, type, Enter.
+# The caption under the first tile: double click, type a name, Enter. The rename starts with the
+# name selected, not ".dwg", which the drawing keeps.
 locate caption caption "$drive" "${names[0]}"
-xdotool mousemove $(middle "$caption") click --repeat 2 --delay 80 1 type "renamed.dwg"
+xdotool mousemove $(middle "$caption") click --repeat 2 --delay 80 1 type "renamed"
 xdotool key Return
 until_true 10 eval '[ -e "$world/drawings/renamed.dwg" ]'
 check "rename in place" "renamed.dwg" "$(ls "$world/drawings" | tr 'A-Z' 'a-z' | grep -x -e renamed.dwg -e "${names[0]}")"

@@ -1,4 +1,6 @@
-// A rename takes one plain file name: each name the rule refuses, and the names it lets through.
+// A rename takes one plain file name (each name the rule refuses, and the names it lets through),
+// and a name typed without the drawing's extension keeps it.
+#include "filecmd/DrawingExtension.h"
 #include "filecmd/PlainFileName.h"
 
 #include <gtest/gtest.h>
@@ -19,6 +21,20 @@ TEST(PlainFileName, EachRuleAndTheNamesItLetsThrough) {
   for (const auto &[rule, names] : rules) {
     EXPECT_EQ(NameRuleText(rule).empty(), rule == R::Plain);
     for (const char *name : names) EXPECT_EQ(CheckPlainFileName(name), rule) << name;
+  }
+}
+
+TEST(DrawingExtension, TheNameComesBeforeItAndANewNameWithoutItKeepsIt) {
+  struct Case {
+    const char *oldName, *typed, *kept;
+    std::size_t nameLength;  // of the old name
+  };
+  for (const Case &c : {Case{"plan.dwg", "renamed", "renamed.dwg", 4}, Case{"plan.dwg", "renamed.DWG", "renamed.DWG", 4},
+                        Case{"plan.dwg", "notes.txt", "notes.txt.dwg", 4}, Case{"a.b.dwg", "c", "c.dwg", 3},
+                        Case{"PLAN.DWG", "x.dwg", "x.dwg", 4}, Case{"noext", "other", "other", 5},
+                        Case{"plan.dwg", "", "", 4}, Case{"plan.dwg", "new.", "new.", 4}, Case{"plan.dwg", "con", "con", 4}}) {
+    EXPECT_EQ(NameLengthBeforeExtension(c.oldName), c.nameLength) << c.oldName;
+    EXPECT_EQ(KeepingExtension(c.typed, c.oldName), c.kept) << c.typed;
   }
 }
 }  // namespace
