@@ -8,13 +8,16 @@
 #include "explorer/MainFrame.h"
 #include "filecmd/ForFileCommands.h"
 #include "filecmd/SelectionCommands.h"
+#include "fw/FrameworkIds.h"
 #include "fw/Menu.h"
 #include "fw/WinApp.h"
 #include "res/resource.h"
+#include "thumbs/EditSearch.h"
 #include "thumbs/RingLayout.h"
 
 #include <windowsx.h>
 
+#include <algorithm>
 #include <cstdlib>
 
 COmbra3View *g_pThumbView = nullptr;
@@ -132,12 +135,14 @@ void COmbra3View::CreateRow(int row, RECT r) {
     }
     ::OffsetRect(&r, ColStep(), 0);
   }
-  SetFocus();
+  // Keys go on to the view, unless the user is typing a search.
+  if (!g_pSearchBox || ::GetFocus() != g_pSearchBox->m_hWnd) SetFocus();
 }
 
 void COmbra3View::RebuildAtTopRow() {
   if (m_nColumns == 0) return;
-  ShowWindow(SW_HIDE);
+  // Redraw off rather than hidden: hiding would flicker and take the focus from the search box.
+  SendMessage(WM_SETREDRAW, FALSE);
   DestroyTileWindows();
   const int rowStep = RowStep();
   const long long range = CappedTotalHeight(rowStep, m_nTotalRows, ClientHeight() % rowStep);
@@ -150,7 +155,8 @@ void COmbra3View::RebuildAtTopRow() {
   ScrollToPosition(POINT{0, static_cast<LONG>(y)});
   m_nTopRow = newTop;
   BuildTiles();
-  ShowWindow(SW_SHOW);
+  SendMessage(WM_SETREDRAW, TRUE);
+  ::RedrawWindow(m_hWnd, nullptr, nullptr, kRedrawAll | RDW_ALLCHILDREN);
 }
 
 void COmbra3View::Relayout(BOOL fitFrame) {
@@ -195,7 +201,16 @@ void COmbra3View::ReloadFolder() {
 }
 
 void COmbra3View::ScrollToRecord(int index) {
-  ResetAndBuild(FALSE);
+  if (!m_hWnd) return;
+  // The layout a fresh build from the first row would find, then the one build at the record's row.
+  RECT client;
+  GetClientRect(&client);
+  m_nColumns = ColumnsThatFit(client.right, m_nGap, ColStep());
+  m_nLayoutColumns = m_nColumns;
+  m_nRecordCount = g_pCatalogue->GetSize();
+  m_nTotalRows = (m_nRecordCount + m_nColumns - 1) / m_nColumns;
+  ::SetScrollPos(m_hWnd, SB_HORZ, 0, TRUE);
+  UpdateScrollSizes();
   m_nTopRow = index / m_nColumns;
   RebuildAtTopRow();
 }
@@ -260,32 +275,58 @@ BOOL COmbra3View::LineUp(int x, int y, int totalHeight) {
   return TRUE;
 }
 
+int COmbra3View::RowAtThumb(int position) const {
+  SCROLLINFO info{sizeof(info), SIF_RANGE | SIF_PAGE, 0, 0, 0, 0, 0};
+  ::GetScrollInfo(m_hWnd, SB_VERT, &info);
+  const long long limit = static_cast<long long>(info.nMax) - info.nMin + 1 - info.nPage;
+  const int lastTop = std::max(0, m_nTotalRows - m_nVisibleRows);
+  if (limit <= 0) return 0;
+  return static_cast<int>(std::clamp(position * static_cast<long long>(lastTop) / limit, 0LL, static_cast<long long>(lastTop)));
+}
+
+void COmbra3View::ShowThumbRow(int position) const {
+  const long long first = static_cast<long long>(RowAtThumb(position)) * m_nColumns;
+  if (g_pMainFrame && first < g_pCatalogue->GetSize())
+    g_pMainFrame->SetMessageText((*g_pCatalogue)[static_cast<int>(first)].m_strDwgName);
+}
+
+void COmbra3View::JumpToThumb(int position) {
+  if (m_nColumns == 0) return;
+  m_nTopRow = RowAtThumb(position);
+  RebuildAtTopRow();
+  // Past the capped range the rebuild puts the thumb where the wrap leaves it; keep it where the
+  // user let it go instead, on a whole row and low enough for a line step down to wrap.
+  const int rowStep = RowStep();
+  const int remainder = ClientHeight() % rowStep;
+  const int total = CappedTotalHeight(rowStep, m_nTotalRows, remainder);
+  if (total < static_cast<long long>(rowStep) * m_nTotalRows + remainder) {
+    const int y = std::max(0, std::min(position - position % rowStep, total - rowStep * (m_nVisibleRows + 1)));
+    ::SetScrollPos(m_hWnd, SB_VERT, m_nTopRow == 0 ? 0 : y, TRUE);
+  }
+  if (g_pMainFrame) g_pMainFrame->SetMessageText(AFX_IDS_IDLEMESSAGE);
+}
+
 BOOL COmbra3View::OnScroll(UINT scrollCode, UINT pos, BOOL doScroll) {
   const POINT position = GetScrollPosition();
   int mapMode = 0;
   SIZE total, page, line;
   GetDeviceScrollSizes(mapMode, total, page, line);
-  const int rowStep = RowStep();
-  BYTE vertical = HIBYTE(scrollCode);
-  if (vertical == SB_THUMBTRACK) {
-    const long long d = static_cast<long long>(pos - pos % static_cast<UINT>(rowStep)) - position.y;
-    if (std::llabs(d) < rowStep) return FALSE;
-    // The thumb moves the rows one row per message, exactly as a line step (also across a wrap).
-    vertical = d > 0 ? SB_LINEDOWN : SB_LINEUP;
-    scrollCode = MAKEWORD(LOBYTE(scrollCode), vertical);
-  }
-  switch (vertical) {
+  switch (HIBYTE(scrollCode)) {
     case SB_LINEDOWN:
-    case SB_PAGEDOWN:
       if (!LineDown(position.x, position.y, total.cy)) return FALSE;
       break;
     case SB_LINEUP:
-    case SB_PAGEUP:
       if (!LineUp(position.x, position.y, total.cy)) return FALSE;
       break;
+    // A click in the trough pages as the keys do.
+    case SB_PAGEDOWN: OnKey(VK_NEXT); return TRUE;
+    case SB_PAGEUP: OnKey(VK_PRIOR); return TRUE;
+    // Moving the tiles row by row behind the thumb cannot follow it through a large folder:
+    // the drag names the row it points at, and the rows are built there once it is let go.
+    case SB_THUMBTRACK: ShowThumbRow(static_cast<int>(pos)); return TRUE;
+    case SB_THUMBPOSITION: JumpToThumb(static_cast<int>(pos)); return TRUE;
     case SB_TOP: OnKey(VK_HOME); return TRUE;
     case SB_BOTTOM: OnKey(VK_END); return TRUE;
-    case SB_THUMBPOSITION: return FALSE;
     case SB_ENDSCROLL:
     case 0xFF: break;
     default: return FALSE;

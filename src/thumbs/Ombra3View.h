@@ -68,6 +68,10 @@ class COmbra3View : public fw::CScrollView {
   void ChangePictureSize(bool larger);
   BOOL LineDown(int x, int y, int totalHeight);
   BOOL LineUp(int x, int y, int totalHeight);
+  // The thumb's place in its track as a row among all rows; a jump there when it is let go.
+  int RowAtThumb(int position) const;
+  void ShowThumbRow(int position) const;
+  void JumpToThumb(int position);
   void OnKey(WPARAM key);
   void OnMouseWheel(short delta);
   void OnBackgroundMenu(LPARAM point);
