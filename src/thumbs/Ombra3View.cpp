@@ -208,9 +208,12 @@ void COmbra3View::ScrollToRecord(int index) {
   m_nColumns = ColumnsThatFit(client.right, m_nGap, ColStep());
   m_nLayoutColumns = m_nColumns;
   m_nRecordCount = g_pCatalogue->GetSize();
-  m_nTotalRows = (m_nRecordCount + m_nColumns - 1) / m_nColumns;
   ::SetScrollPos(m_hWnd, SB_HORZ, 0, TRUE);
-  UpdateScrollSizes();
+  // The scroll range must hold the record's row before the rebuild scrolls there.
+  if (const int rows = (m_nRecordCount + m_nColumns - 1) / m_nColumns; rows != m_nTotalRows) {
+    m_nTotalRows = rows;
+    UpdateScrollSizes();
+  }
   m_nTopRow = index / m_nColumns;
   RebuildAtTopRow();
 }
@@ -235,7 +238,13 @@ void COmbra3View::ChangePictureSize(bool larger) {
 
 void COmbra3View::UnselectAll() {
   for (int i = 0; i < g_pCatalogue->GetSize(); ++i) (*g_pCatalogue)[i].Deselect();
-  for (int i = 0; i < m_nRingSize; ++i) m_tiles[i].UnselectTile();
+  // Unselecting a caption rewrites its text and repaints it: only the highlighted ones need it
+  // (a search keystroke otherwise spends as long on this as on a tenth of the rebuild).
+  for (int i = 0; i < m_nRingSize; ++i) {
+    int start = 0, end = 0;
+    if (m_tiles[i].m_editCaption.m_hWnd) m_tiles[i].m_editCaption.GetSel(start, end);
+    if (end > start) m_tiles[i].UnselectTile();
+  }
 }
 
 void COmbra3View::SelectAll() {
