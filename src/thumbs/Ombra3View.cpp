@@ -8,10 +8,11 @@
 #include "explorer/MainFrame.h"
 #include "filecmd/ForFileCommands.h"
 #include "filecmd/SelectionCommands.h"
+#include "fw/FrameworkIds.h"
 #include "fw/Menu.h"
 #include "fw/WinApp.h"
 #include "res/resource.h"
-#include "thumbs/FocusedEdit.h"
+#include "thumbs/EditSearch.h"
 #include "thumbs/RingLayout.h"
 
 #include <windowsx.h>
@@ -138,12 +139,14 @@ void COmbra3View::CreateRow(int row, RECT r) {
     }
     ::OffsetRect(&r, ColStep(), 0);
   }
-  SetFocus();
+  // Keys go on to the view, unless the user is typing a search.
+  if (!g_pSearchBox || ::GetFocus() != g_pSearchBox->m_hWnd) SetFocus();
 }
 
 void COmbra3View::RebuildAtTopRow() {
   if (m_nColumns == 0) return;
-  ShowWindow(SW_HIDE);
+  // Redraw off rather than hidden: hiding would flicker and take the focus from the search box.
+  SendMessage(WM_SETREDRAW, FALSE);
   DestroyTileWindows();
   const int rowStep = RowStep();
   const int height = ClientHeight();
@@ -159,7 +162,8 @@ void COmbra3View::RebuildAtTopRow() {
   ScrollToPosition(POINT{0, ScrollPositionForTopRow(newTop, rowStep, visibleRows, m_nTotalRows, height % rowStep)});
   m_nTopRow = newTop;
   BuildTiles();
-  ShowWindow(SW_SHOW);
+  SendMessage(WM_SETREDRAW, TRUE);
+  ::RedrawWindow(m_hWnd, nullptr, nullptr, kRedrawAll | RDW_ALLCHILDREN);
 }
 
 void COmbra3View::Relayout(BOOL fitFrame) {
@@ -205,7 +209,19 @@ void COmbra3View::ReloadFolder() {
 }
 
 void COmbra3View::ScrollToRecord(int index) {
-  ResetAndBuild(FALSE);
+  if (!m_hWnd) return;
+  // The layout a fresh build from the first row would find, then the one build at the record's row.
+  RECT client;
+  GetClientRect(&client);
+  m_nColumns = ColumnsThatFit(client.right, m_nGap, ColStep());
+  m_nLayoutColumns = m_nColumns;
+  m_nRecordCount = g_pCatalogue->GetSize();
+  ::SetScrollPos(m_hWnd, SB_HORZ, 0, TRUE);
+  // The scroll range must hold the record's row before the rebuild scrolls there.
+  if (const int rows = (m_nRecordCount + m_nColumns - 1) / m_nColumns; rows != m_nTotalRows) {
+    m_nTotalRows = rows;
+    UpdateScrollSizes();
+  }
   m_nTopRow = index / m_nColumns;
   RebuildAtTopRow();
 }
@@ -230,7 +246,13 @@ void COmbra3View::ChangePictureSize(bool larger) {
 
 void COmbra3View::UnselectAll() {
   for (int i = 0; i < g_pCatalogue->GetSize(); ++i) (*g_pCatalogue)[i].Deselect();
-  for (int i = 0; i < m_nRingSize; ++i) m_tiles[i].UnselectTile();
+  // Unselecting a caption rewrites its text and repaints it: only the highlighted ones need it
+  // (a search keystroke otherwise spends as long on this as on a tenth of the rebuild).
+  for (int i = 0; i < m_nRingSize; ++i) {
+    int start = 0, end = 0;
+    if (m_tiles[i].m_editCaption.m_hWnd) m_tiles[i].m_editCaption.GetSel(start, end);
+    if (end > start) m_tiles[i].UnselectTile();
+  }
 }
 
 void COmbra3View::SelectAll() {
@@ -293,32 +315,58 @@ BOOL COmbra3View::LineUp(int x, int y, int totalHeight) {
   return TRUE;
 }
 
+int COmbra3View::RowAtThumb(int position) const {
+  SCROLLINFO info{sizeof(info), SIF_RANGE | SIF_PAGE, 0, 0, 0, 0, 0};
+  ::GetScrollInfo(m_hWnd, SB_VERT, &info);
+  const long long limit = static_cast<long long>(info.nMax) - info.nMin + 1 - info.nPage;
+  const int lastTop = std::max(0, m_nTotalRows - m_nVisibleRows);
+  if (limit <= 0) return 0;
+  return static_cast<int>(std::clamp(position * static_cast<long long>(lastTop) / limit, 0LL, static_cast<long long>(lastTop)));
+}
+
+void COmbra3View::ShowThumbRow(int position) const {
+  const long long first = static_cast<long long>(RowAtThumb(position)) * m_nColumns;
+  if (g_pMainFrame && first < g_pCatalogue->GetSize())
+    g_pMainFrame->SetMessageText((*g_pCatalogue)[static_cast<int>(first)].m_strDwgName);
+}
+
+void COmbra3View::JumpToThumb(int position) {
+  if (m_nColumns == 0) return;
+  m_nTopRow = RowAtThumb(position);
+  RebuildAtTopRow();
+  // Past the capped range the rebuild puts the thumb where the wrap leaves it; keep it where the
+  // user let it go instead, on a whole row and low enough for a line step down to wrap.
+  const int rowStep = RowStep();
+  const int remainder = ClientHeight() % rowStep;
+  const int total = CappedTotalHeight(rowStep, m_nTotalRows, remainder);
+  if (total < static_cast<long long>(rowStep) * m_nTotalRows + remainder) {
+    const int y = std::max(0, std::min(position - position % rowStep, total - rowStep * (m_nVisibleRows + 1)));
+    ::SetScrollPos(m_hWnd, SB_VERT, m_nTopRow == 0 ? 0 : y, TRUE);
+  }
+  if (g_pMainFrame) g_pMainFrame->SetMessageText(AFX_IDS_IDLEMESSAGE);
+}
+
 BOOL COmbra3View::OnScroll(UINT scrollCode, UINT pos, BOOL doScroll) {
   const POINT position = GetScrollPosition();
   int mapMode = 0;
   SIZE total, page, line;
   GetDeviceScrollSizes(mapMode, total, page, line);
-  const int rowStep = RowStep();
-  BYTE vertical = HIBYTE(scrollCode);
-  if (vertical == SB_THUMBTRACK) {
-    const long long d = static_cast<long long>(pos - pos % static_cast<UINT>(rowStep)) - position.y;
-    if (std::llabs(d) < rowStep) return FALSE;
-    // The thumb moves the rows one row per message, exactly as a line step (also across a wrap).
-    vertical = d > 0 ? SB_LINEDOWN : SB_LINEUP;
-    scrollCode = MAKEWORD(LOBYTE(scrollCode), vertical);
-  }
-  switch (vertical) {
+  switch (HIBYTE(scrollCode)) {
     case SB_LINEDOWN:
-    case SB_PAGEDOWN:
       if (!LineDown(position.x, position.y, total.cy)) return FALSE;
       break;
     case SB_LINEUP:
-    case SB_PAGEUP:
       if (!LineUp(position.x, position.y, total.cy)) return FALSE;
       break;
+    // A click in the trough pages as the keys do.
+    case SB_PAGEDOWN: OnKey(VK_NEXT); return TRUE;
+    case SB_PAGEUP: OnKey(VK_PRIOR); return TRUE;
+    // Moving the tiles row by row behind the thumb cannot follow it through a large folder:
+    // the drag names the row it points at, and the rows are built there once it is let go.
+    case SB_THUMBTRACK: ShowThumbRow(static_cast<int>(pos)); return TRUE;
+    case SB_THUMBPOSITION: JumpToThumb(static_cast<int>(pos)); return TRUE;
     case SB_TOP: OnKey(VK_HOME); return TRUE;
     case SB_BOTTOM: OnKey(VK_END); return TRUE;
-    case SB_THUMBPOSITION: return FALSE;
     case SB_ENDSCROLL:
     case 0xFF: break;
     default: return FALSE;
@@ -335,13 +383,13 @@ void COmbra3View::OnKey(WPARAM key) {
     case VK_PRIOR:
       m_nTopRow = m_nTopRow > m_nVisibleRows ? m_nTopRow - m_nVisibleRows : 0;
       RebuildAtTopRow();
-      MoveKeyMark(std::max(0, current - page));
+      MoveKeyMark(InView(std::max(0, current - page)));
       break;
     case VK_NEXT:
       m_nTopRow += m_nVisibleRows;
       if (m_nTopRow + m_nVisibleRows > m_nTotalRows) m_nTopRow = m_nTotalRows - m_nVisibleRows;
       RebuildAtTopRow();
-      MoveKeyMark(std::min(m_nRecordCount - 1, current + page));
+      MoveKeyMark(InView(std::min(m_nRecordCount - 1, current + page)));
       break;
     case VK_END:
       m_nTopRow = m_nTotalRows - m_nVisibleRows;
@@ -366,6 +414,13 @@ void COmbra3View::OnKey(WPARAM key) {
       break;
     default: break;
   }
+}
+
+int COmbra3View::InView(int record) const {
+  if (m_nColumns == 0) return record;
+  const int lastRow = std::max(m_nTopRow, m_nTopRow + m_nVisibleRows - 1);
+  const int row = std::max(m_nTopRow, std::min(record / m_nColumns, lastRow));
+  return std::min(row * m_nColumns + record % m_nColumns, m_nRecordCount - 1);
 }
 
 exCDwgThumbnail *COmbra3View::TileOf(int record) const {

@@ -84,10 +84,16 @@ class COmbra3View : public fw::CScrollView {
   void ChangePictureSize(bool larger);
   BOOL LineDown(int x, int y, int totalHeight);
   BOOL LineUp(int x, int y, int totalHeight);
+  // The thumb's place in its track as a row among all rows; a jump there when it is let go.
+  int RowAtThumb(int position) const;
+  void ShowThumbRow(int position) const;
+  void JumpToThumb(int position);
   void OnKey(WPARAM key);
   // Moves the keyboard to the record, scrolling it into view, and chooses it as a click does.
   void MoveKeyMark(int record);
   exCDwgThumbnail *TileOf(int record) const;
+  // The record in the same column on the nearest row in view.
+  int InView(int record) const;
   void OnMouseWheel(short delta);
   void OnBackgroundMenu(LPARAM point);
   void OnPaint();

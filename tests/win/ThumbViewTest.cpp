@@ -111,12 +111,13 @@ bool AcceptEnabled(HWND frame) { return SendMessageA(ToolBars(frame)[1], TB_ISBU
 
 class ThumbView : public BrowseTest {
  protected:
-  // Browses the scratch folder with the given picture size; the watcher's view is width x height.
+  // Browses the scratch folder, or the one given, with the given picture size; the watcher's view is
+  // width x height.
   BrowseOutcome Run(int width, int height, const std::function<void(HWND frame, HWND view)> &watcher, int pictureWidth = 0,
-                    int pictureHeight = 0, bool cancel = true) {
+                    int pictureHeight = 0, bool cancel = true, std::string folder = {}) {
     m_state.Write("[Size]\r\nSplitterSize=120\r\nWindowWidth=1000\r\nWindowHeight=700\r\n\r\n[View]\r\nPictureWidth=" +
                   std::to_string(pictureWidth) + "\r\nPictureHeight=" + std::to_string(pictureHeight) + "\r\nSort=0\r\n");
-    const std::string folder = Folder() + "\\";
+    folder = (folder.empty() ? Folder() : folder) + "\\";
     return Browse(BrowseArgs(std::wstring(folder.begin(), folder.end()).c_str()), [&](HWND frame) {
       SizeView(frame, width, height);
       // The X server's focus events reach the new frame a little later and move the focus to its
@@ -137,14 +138,14 @@ class ThumbView : public BrowseTest {
 };
 
 TEST_F(ThumbView, KeysWheelAndScrollBarKeepEveryVisibleRowFilled) {
-  constexpr WPARAM kWheelDown = 0xFF88u << 16, kWheelUp = WHEEL_DELTA << 16, kThumbTo330 = 330 << 16 | SB_THUMBTRACK;
+  constexpr WPARAM kWheelDown = 0xFF88u << 16, kWheelUp = WHEEL_DELTA << 16, kThumbAt330 = 330 << 16 | SB_THUMBPOSITION;
   const std::vector<std::array<WPARAM, 3>> cases{
-      {WM_KEYDOWN, VK_DOWN, 0},  {WM_KEYDOWN, VK_UP, 0},          {WM_KEYDOWN, VK_UP, 0},       {WM_KEYDOWN, VK_NEXT, 16},
-      {WM_KEYDOWN, VK_PRIOR, 0}, {WM_KEYDOWN, VK_END, 104},       {WM_KEYDOWN, VK_DOWN, 104},   {WM_KEYDOWN, VK_PRIOR, 88},
-      {WM_KEYDOWN, VK_HOME, 0},  {WM_KEYDOWN, VK_DOWN, 0},        {WM_KEYDOWN, VK_DOWN, 0},     {WM_KEYDOWN, VK_DOWN, 0},
-      {WM_KEYDOWN, VK_DOWN, 4},  {WM_KEYDOWN, VK_UP, 4},          {WM_KEYDOWN, VK_RIGHT, 4},    {WM_KEYDOWN, VK_HOME, 0},
+      {WM_KEYDOWN, VK_DOWN, 0},  {WM_KEYDOWN, VK_UP, 0},          {WM_KEYDOWN, VK_UP, 0},        {WM_KEYDOWN, VK_NEXT, 16},
+      {WM_KEYDOWN, VK_PRIOR, 0}, {WM_KEYDOWN, VK_END, 104},       {WM_KEYDOWN, VK_DOWN, 104},    {WM_KEYDOWN, VK_PRIOR, 88},
+      {WM_KEYDOWN, VK_HOME, 0},  {WM_KEYDOWN, VK_DOWN, 0},        {WM_KEYDOWN, VK_DOWN, 0},      {WM_KEYDOWN, VK_DOWN, 0},
+      {WM_KEYDOWN, VK_DOWN, 4},  {WM_KEYDOWN, VK_UP, 4},          {WM_KEYDOWN, VK_RIGHT, 4},     {WM_KEYDOWN, VK_HOME, 0},
       {WM_MOUSEWHEEL, kWheelDown, 12}, {WM_MOUSEWHEEL, kWheelUp, 0}, {WM_VSCROLL, SB_BOTTOM, 104},
-      {WM_VSCROLL, SB_TOP, 0},   {WM_VSCROLL, kThumbTo330, 4}};
+      {WM_VSCROLL, SB_TOP, 0},   {WM_VSCROLL, kThumbAt330, 8},    {WM_VSCROLL, SB_PAGEDOWN, 24}, {WM_VSCROLL, SB_PAGEUP, 8}};
   MakeDrawings(120);
   Run(4 * 178 + 20, 4 * m_step, [&](HWND frame, HWND view) {
     for (const auto &[message, wParam, firstRecord] : cases) {
@@ -593,5 +594,96 @@ TEST_F(ThumbView, TheTooltipNamesSizeAndDateOfEachTile) {
     text = buffer;
   });
   EXPECT_EQ(text, "d000.dwg" + std::string(12, ' ') + "Size=5" + std::string(14, ' ') + "07/03/2026;09.05.08");
+}
+
+// What the browse's thread is sent while a test watches it: tiles created in the view, focus lost
+// by the search box, the view shown or hidden.
+struct SentRecord {
+  static inline HWND view, box;
+  static inline int tilesCreated, boxFocusLost, viewShownOrHidden;
+  static LRESULT CALLBACK Hook(int code, WPARAM wParam, LPARAM lParam) {
+    const CWPSTRUCT &sent = *reinterpret_cast<CWPSTRUCT *>(lParam);
+    char name[16] = "";
+    if (sent.message == WM_CREATE && GetParent(sent.hwnd) == view && GetClassNameA(sent.hwnd, name, sizeof name) &&
+        std::string(name) == "FwWnd")
+      ++tilesCreated;
+    if (sent.message == WM_KILLFOCUS && sent.hwnd == box) ++boxFocusLost;
+    if (sent.message == WM_SHOWWINDOW && sent.hwnd == view) ++viewShownOrHidden;
+    return CallNextHookEx(nullptr, code, wParam, lParam);
+  }
+};
+
+HWND FocusOf(HWND frame) {
+  GUITHREADINFO info{};
+  info.cbSize = sizeof info;
+  GetGUIThreadInfo(GetWindowThreadProcessId(frame, nullptr), &info);
+  return info.hwndFocus;
+}
+
+TEST_F(ThumbView, ATypedSearchBuildsTheRingOnceInPlaceAndKeepsTheFocus) {
+  const std::vector<std::pair<WPARAM, int>> keys{{'d', 0}, {'1', 100}, {'1', 108}};  // the first record shown
+  MakeDrawings(120);
+  Run(4 * 178 + 20, 4 * m_step, [&](HWND frame, HWND view) {
+    Post(frame, SearchBox(frame), WM_LBUTTONDOWN, MK_LBUTTON);
+    Post(frame, SearchBox(frame), WM_LBUTTONUP, 0);
+    ASSERT_EQ(FocusOf(frame), SearchBox(frame));
+    SentRecord::view = view;
+    SentRecord::box = SearchBox(frame);
+    HHOOK hook = SetWindowsHookExA(WH_CALLWNDPROC, SentRecord::Hook, nullptr, GetWindowThreadProcessId(frame, nullptr));
+    for (const auto &[key, first] : keys) {
+      SentRecord::tilesCreated = SentRecord::boxFocusLost = SentRecord::viewShownOrHidden = 0;
+      Post(frame, SearchBox(frame), WM_CHAR, key);
+      EXPECT_EQ(Names(view), Drawings(first, 16, 120)) << char(key);
+      EXPECT_EQ(SentRecord::tilesCreated, std::min(24, 120 - first)) << char(key);
+      EXPECT_EQ(SentRecord::boxFocusLost, 0) << char(key);
+      EXPECT_EQ(SentRecord::viewShownOrHidden, 0) << char(key);
+      EXPECT_EQ(FocusOf(frame), SearchBox(frame)) << char(key);
+    }
+    UnhookWindowsHookEx(hook);
+  });
+}
+
+TEST_F(ThumbView, TheThumbJumpsToItsRowOfAHundredThousandAndTheLineKeysGoOnFromThere) {
+  constexpr int kRecords = 100000, kLastTop = kRecords / 4 - 4;
+  const auto drawings = [&](int first, int count) {
+    std::vector<std::string> names;
+    char name[16];
+    for (int i = first; i < std::min(kRecords, first + count); ++i)
+      names.push_back((std::snprintf(name, 16, "d%06d.dwg", i), name));
+    return names;
+  };
+  Run(
+      4 * 178 + 20, 4 * m_step,
+      [&](HWND frame, HWND view) {
+        SCROLLINFO bar{};
+        bar.cbSize = sizeof bar;
+        bar.fMask = SIF_ALL;
+        GetScrollInfo(view, SB_VERT, &bar);
+        const int limit = bar.nMax - static_cast<int>(bar.nPage) + 1, middle = limit / 2;
+        const int row = static_cast<int>(static_cast<long long>(middle) * kLastTop / limit);
+        ASSERT_NEAR(row, kLastTop / 2, 1);
+        // While dragged the thumb names its row and leaves the tiles; let go, the rows are built there.
+        Post(frame, view, WM_VSCROLL, MAKEWPARAM(SB_THUMBTRACK, middle));
+        char status[64] = "";
+        SendMessageA(FindWindowExA(frame, nullptr, STATUSCLASSNAMEA, nullptr), SB_GETTEXTA, 0, reinterpret_cast<LPARAM>(status));
+        EXPECT_EQ(status, drawings(row * 4, 1)[0]);
+        EXPECT_EQ(Names(view), drawings(0, 16));
+        Post(frame, view, WM_VSCROLL, MAKEWPARAM(SB_THUMBPOSITION, middle));
+        ASSERT_EQ(Names(view), drawings(row * 4, 16));
+        EXPECT_NEAR(GetScrollPos(view, SB_VERT), middle, m_step);
+        // Down and back up past the row of the jump, every visible row filled in its place.
+        const std::vector<std::pair<WPARAM, int>> steps{{SB_LINEDOWN, 1}, {SB_LINEDOWN, 2}, {SB_LINEUP, 1},  {SB_LINEUP, 0},
+                                                        {SB_LINEUP, -1},  {SB_LINEUP, -2},  {SB_LINEUP, -3}, {SB_LINEDOWN, -2}};
+        for (const auto &[step, offset] : steps) {
+          Post(frame, view, WM_VSCROLL, step);
+          EXPECT_EQ(Names(view), drawings((row + offset) * 4, 16)) << offset;
+        }
+        // The thumb let go at the end of its track shows the last rows.
+        Post(frame, view, WM_VSCROLL, MAKEWPARAM(SB_THUMBPOSITION, limit));
+        EXPECT_EQ(Names(view), drawings(kLastTop * 4, 16));
+        Post(frame, view, WM_VSCROLL, SB_LINEUP);
+        EXPECT_EQ(Names(view), drawings((kLastTop - 1) * 4, 16));
+      },
+      0, 0, true, "Z:\\tmp\\lumvex-test-view-100k");  // made by the build, empty drawings
 }
 }  // namespace
