@@ -86,10 +86,14 @@ std::vector<std::string> Drawings(int first, int count, int records) {
 // (limits of the search box's text) have arrived: a thread takes its posted messages in order.
 void Sync(HWND frame) {
   static WPARAM marker = 100000;
+  const WaitingFor waiting("the view's thread to take the messages posted to it");
   for (int round = 0; round < 2; ++round) {
     PostMessageA(SearchBox(frame), EM_SETLIMITTEXT, ++marker, 0);
-    for (int waited = 0; waited < 10000 && WPARAM(SendMessageA(SearchBox(frame), EM_GETLIMITTEXT, 0, 0)) != marker; ++waited)
+    const DWORD start = GetTickCount();
+    while (WPARAM(SendMessageA(SearchBox(frame), EM_GETLIMITTEXT, 0, 0)) != marker) {
+      ASSERT_LT(GetTickCount() - start, 10000u) << "the view's thread took no posted message for 10 s";
       Sleep(1);
+    }
   }
 }
 void Post(HWND frame, HWND target, UINT message, WPARAM wParam, LPARAM lParam = 0) {
@@ -203,7 +207,8 @@ TEST_F(ThumbView, PictureSizesStepAndKeepTheTopRowsFirstDrawing) {
 // Answers the context menu with its items' keys and the shell's confirmation with a button.
 std::thread Answer(std::vector<WPARAM> keys, int confirmButton = 0) {
   return std::thread([keys, confirmButton] {
-    HWND menu = WaitForWindow("#32768", nullptr, 5000);
+    HWND menu = WaitForPopupMenu();
+    if (!menu) return;
     for (WPARAM key : keys) PostMessageA(menu, WM_KEYDOWN, key, 0);
     if (HWND confirm = confirmButton ? WaitForWindow("#32770", "Confirm file deletion", 5000) : nullptr)
       SendMessageA(GetDlgItem(confirm, confirmButton), BM_CLICK, 0, 0);

@@ -64,7 +64,7 @@ inline HWND OpenFolderSettings(HWND tree) {
   SetCursorPos(centre.x, centre.y);  // where the click happens, as the tree reads it
   PostMessageA(tree, WM_RBUTTONDOWN, MK_RBUTTON, at);
   PostMessageA(tree, WM_RBUTTONUP, 0, at);
-  HWND menu = WaitForWindow("#32768", nullptr, 5000);
+  HWND menu = WaitForPopupMenu();
   if (!menu) return nullptr;
   PostMessageA(menu, WM_CHAR, 'f', 0);
   return WaitForWindow("#32770", "Folder settings", 5000);
