@@ -215,12 +215,19 @@ std::thread Answer(std::vector<WPARAM> keys, int confirmButton = 0) {
   });
 }
 
-int ClipboardFileCount() {
-  int count = -1;
-  if (!OpenClipboard(nullptr)) return count;
-  if (HANDLE drop = GetClipboardData(CF_HDROP)) count = static_cast<int>(DragQueryFileA(HDROP(drop), 0xFFFFFFFF, nullptr, 0));
+std::vector<std::string> ClipboardPaths() {
+  std::vector<std::string> paths;
+  if (!OpenClipboard(nullptr)) return {"(the clipboard could not be opened)"};
+  if (HANDLE drop = GetClipboardData(CF_HDROP)) {
+    const UINT count = DragQueryFileA(HDROP(drop), 0xFFFFFFFF, nullptr, 0);
+    for (UINT i = 0; i < count; ++i) {
+      char path[MAX_PATH] = "";
+      DragQueryFileA(HDROP(drop), i, path, MAX_PATH);
+      paths.push_back(path);
+    }
+  }
   CloseClipboard();
-  return count;
+  return paths;
 }
 
 TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
@@ -244,7 +251,7 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
   MakeDrawings(6);
   const ScratchFolder elsewhere("thumbview-other");
   const std::string other = elsewhere.File("new.dwg", "");
-  int copiedFromMenu = 0, copiedAll = 0;
+  std::vector<std::string> copiedFromMenu, copiedAll;
   Run(4 * 178 + 20, 400, [&](HWND frame, HWND view) {
     std::string title = WindowText(frame);
     for (const Case &c : cases) {
@@ -256,11 +263,11 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
       EXPECT_EQ(Marked(view), c.marked) << c.tile;
       EXPECT_EQ(AcceptEnabled(frame), c.accept) << c.tile;
       EXPECT_EQ(WindowText(frame), title) << c.tile;
-      if (c.menu.size() == 2) copiedFromMenu = ClipboardFileCount();
+      if (c.menu.size() == 2) copiedFromMenu = ClipboardPaths();
     }
     SendMessageA(frame, WM_COMMAND, kMarkAll, 0);
     SendMessageA(frame, WM_COMMAND, kCopy, 0);
-    copiedAll = ClipboardFileCount();
+    copiedAll = ClipboardPaths();
     PutFileOnClipboard(other);
     std::thread answer = Answer({'P'});
     Post(frame, view, WM_RBUTTONDOWN, MK_RBUTTON, MAKELPARAM(4 * 178 + 10, 5));  // the background's &Paste
@@ -268,8 +275,12 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
     Sync(frame);
     EXPECT_EQ(Names(view, false).back(), "new.dwg");
   });
-  EXPECT_EQ(copiedFromMenu, 2);
-  EXPECT_EQ(copiedAll, 6);
+  const auto inFolder = [&](std::vector<std::string> names) {
+    for (std::string &name : names) name = Folder() + "\\" + name;
+    return names;
+  };
+  EXPECT_EQ(copiedFromMenu, inFolder({"d002.dwg", "d003.dwg"}));
+  EXPECT_EQ(copiedAll, inFolder(Drawings(0, 6, 6)));
   EXPECT_EQ(GetFileAttributesA(m_folder.File("d004.dwg").c_str()) != INVALID_FILE_ATTRIBUTES, true);
 }
 
