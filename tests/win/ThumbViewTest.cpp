@@ -110,6 +110,21 @@ void SizeView(HWND frame, int width, int height) {
                window.bottom - window.top + height - client.bottom, SWP_NOMOVE | SWP_NOZORDER);
 }
 
+std::vector<std::string> ClipboardPaths() {
+  std::vector<std::string> paths;
+  if (!OpenClipboard(nullptr)) return {"(the clipboard could not be opened)"};
+  if (HANDLE drop = GetClipboardData(CF_HDROP)) {
+    const UINT count = DragQueryFileA(HDROP(drop), 0xFFFFFFFF, nullptr, 0);
+    for (UINT i = 0; i < count; ++i) {
+      char path[MAX_PATH] = "";
+      DragQueryFileA(HDROP(drop), i, path, MAX_PATH);
+      paths.push_back(path);
+    }
+  }
+  CloseClipboard();
+  return paths;
+}
+
 bool AcceptEnabled(HWND frame) { return SendMessageA(ToolBars(frame)[1], TB_ISBUTTONENABLED, 32795, 0) != 0; }
 
 class ThumbView : public BrowseTest {
@@ -155,6 +170,11 @@ TEST_F(ThumbView, KeysWheelAndScrollBarKeepEveryVisibleRowFilled) {
     }
     SendMessageA(SearchBox(frame), WM_SETTEXT, 0, LPARAM("d119"));  // the last row at the top
     EXPECT_EQ(Names(view), Drawings(116, 4, 120));
+    // The ring has wrapped several times: a click marks the drawing the tile shows.
+    for (const Tile &tile : Tiles(view))
+      if (tile.name == "d117.dwg") Post(frame, tile.hwnd, WM_LBUTTONDOWN, MK_LBUTTON);
+    SendMessageA(frame, WM_COMMAND, kCopy, 0);
+    EXPECT_EQ(ClipboardPaths(), std::vector<std::string>{Folder() + "\\d117.dwg"});
   });
 }
 
@@ -213,21 +233,6 @@ std::thread Answer(std::vector<WPARAM> keys, int confirmButton = 0) {
     if (HWND confirm = confirmButton ? WaitForWindow("#32770", "Confirm file deletion", 5000) : nullptr)
       SendMessageA(GetDlgItem(confirm, confirmButton), BM_CLICK, 0, 0);
   });
-}
-
-std::vector<std::string> ClipboardPaths() {
-  std::vector<std::string> paths;
-  if (!OpenClipboard(nullptr)) return {"(the clipboard could not be opened)"};
-  if (HANDLE drop = GetClipboardData(CF_HDROP)) {
-    const UINT count = DragQueryFileA(HDROP(drop), 0xFFFFFFFF, nullptr, 0);
-    for (UINT i = 0; i < count; ++i) {
-      char path[MAX_PATH] = "";
-      DragQueryFileA(HDROP(drop), i, path, MAX_PATH);
-      paths.push_back(path);
-    }
-  }
-  CloseClipboard();
-  return paths;
 }
 
 TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
