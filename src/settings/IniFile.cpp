@@ -85,12 +85,15 @@ bool CIniFile::Load() {
     m_error = kOpenError;
     return false;
   }
+  LoadFrom(file.get());
+  return true;
+}
 
+void CIniFile::LoadFrom(std::FILE *file) {
   std::string currentSection;
   std::string line;
   line.reserve(kLineBudget);
-  while (ReadLine(file.get(), line) == LineRead::Line) ParseLine(line, currentSection);
-  return true;
+  while (ReadLine(file, line) == LineRead::Line) ParseLine(line, currentSection);
 }
 
 void CIniFile::ParseLine(const std::string &line, std::string &currentSection) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstdio>
 #include <string>
 #include <vector>
 
@@ -19,6 +20,9 @@ class CIniFile {
   void SetFilePath(std::string path);
   bool Load();
   void Save();
+  // What Load takes from the file and what Save writes, without the file.
+  void LoadFrom(std::FILE *file);
+  std::string Serialize() const;
 
   std::string GetString(std::string section, std::string name);
   bool SetString(std::string section, std::string name, std::string value, bool create);
@@ -43,5 +47,4 @@ class CIniFile {
 
  private:
   void ParseLine(const std::string &line, std::string &currentSection);
-  std::string Serialize() const;
 };
