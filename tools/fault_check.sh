@@ -65,7 +65,8 @@ build_tests() {
 # case that began and never ended is a crash, or a timeout when ctest's limit ended its program.
 # A failed program with no failing case of its own is listed as "ctest: PROGRAM".
 classify() {
-  awk -v OFS='\t' '
+  # Programs may write any bytes; only printable text can name a case.
+  tr -cd '\11\12\40-\176' | LC_ALL=C awk -v OFS='\t' '
     function flush() {
       if (program == "" || status == "passed") return
       if (running != "") found(running, status == "timeout" ? "timeout" : "crash")
