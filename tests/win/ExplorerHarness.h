@@ -10,10 +10,10 @@
 #include <ole2.h>
 #include <shlobj.h>
 
-#include <fstream>
 #include <atomic>
 #include <cstdio>
 #include <cstring>
+#include <fstream>
 #include <functional>
 #include <sstream>
 #include <string>
@@ -76,11 +76,14 @@ inline HWND WaitForWindow(const char *className, const char *title, int millisec
           auto *search = reinterpret_cast<Search *>(param);
           DWORD process = 0;
           GetWindowThreadProcessId(hwnd, &process);
-          char name[64] = "", text[256] = "";
+          char name[64] = "";
           GetClassNameA(hwnd, name, sizeof name);
-          GetWindowTextA(hwnd, text, sizeof text);
-          if (process != GetCurrentProcessId() || !IsWindowVisible(hwnd) || std::strcmp(name, search->className) != 0 ||
-              (search->title && std::strcmp(text, search->title) != 0))
+          if (process != GetCurrentProcessId() || !IsWindowVisible(hwnd) || std::strcmp(name, search->className) != 0)
+            return TRUE;
+          // The title as the window keeps it: asking the window would wait for its thread.
+          wchar_t text[256] = L"";
+          InternalGetWindowText(hwnd, text, 256);
+          if (search->title && std::wstring(text) != std::wstring(search->title, search->title + std::strlen(search->title)))
             return TRUE;
           search->found = hwnd;
           return FALSE;
