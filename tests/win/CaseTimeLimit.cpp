@@ -6,7 +6,9 @@
 #include <cstdio>
 #include <cstdlib>
 #include <mutex>
+#include <string>
 #include <thread>
+#include <utility>
 
 namespace {
 // Generous for a loaded machine: the longest case takes a few seconds.
@@ -17,29 +19,33 @@ DWORD LimitMs() {
   return seconds && std::atoi(seconds) > 0 ? static_cast<DWORD>(std::atoi(seconds)) * 1000 : kDefaultLimitMs;
 }
 
-// Starts the clock at every case and stops it at its end; a watch thread ends the program when
-// a case outlives the limit. The line it prints is read by the fault harness.
-class CaseClock : public ::testing::EmptyTestEventListener {
+// The clock of the running case, watched by a thread of its own. It lives as long as the
+// process: its thread may still be waiting while the program's statics are destroyed.
+class CaseClock {
  public:
-  CaseClock() : m_hCaseEnded(CreateEventA(nullptr, FALSE, FALSE, nullptr)), m_hCaseStarted(CreateEventA(nullptr, FALSE, FALSE, nullptr)) {
-    std::thread([this] { Watch(); }).detach();
+  static CaseClock &Get() {
+    static CaseClock *const clock = new CaseClock;
+    return *clock;
   }
 
- private:
-  void OnTestStart(const ::testing::TestInfo &info) override {
+  void Start(std::string name) {
     {
       std::lock_guard<std::mutex> hold(m_lock);
-      m_name = std::string(info.test_suite_name()) + "." + info.name();
+      m_name = std::move(name);
     }
     SetEvent(m_hCaseStarted);
   }
-  void OnTestEnd(const ::testing::TestInfo &) override { SetEvent(m_hCaseEnded); }
+  void Stop() { SetEvent(m_hCaseEnded); }
 
+ private:
+  CaseClock() { std::thread([this] { Watch(); }).detach(); }
+
+  // Ends the program when a case outlives the limit; the lines it prints are read by the fault
+  // harness.
   void Watch() {
     const DWORD limit = LimitMs();
-    for (;;) {
-      WaitForSingleObject(m_hCaseStarted, INFINITE);
-      if (WaitForSingleObject(m_hCaseEnded, limit) == WAIT_OBJECT_0) continue;
+    while (WaitForSingleObject(m_hCaseStarted, INFINITE) == WAIT_OBJECT_0) {
+      if (WaitForSingleObject(m_hCaseEnded, limit) != WAIT_TIMEOUT) continue;
       std::string waits;
       {
         std::lock_guard<std::mutex> hold(NamedWaits::Get().lock);
@@ -54,13 +60,22 @@ class CaseClock : public ::testing::EmptyTestEventListener {
     }
   }
 
-  HANDLE m_hCaseEnded, m_hCaseStarted;  // for the program's life
+  const HANDLE m_hCaseStarted = CreateEventA(nullptr, FALSE, FALSE, nullptr);
+  const HANDLE m_hCaseEnded = CreateEventA(nullptr, FALSE, FALSE, nullptr);
   std::mutex m_lock;
   std::string m_name;
 };
 
+// Starts the clock at every case and stops it at its end.
+class CaseClockListener : public ::testing::EmptyTestEventListener {
+  void OnTestStart(const ::testing::TestInfo &info) override {
+    CaseClock::Get().Start(std::string(info.test_suite_name()) + "." + info.name());
+  }
+  void OnTestEnd(const ::testing::TestInfo &) override { CaseClock::Get().Stop(); }
+};
+
 const bool kInstalled = [] {
-  ::testing::UnitTest::GetInstance()->listeners().Append(new CaseClock);
+  ::testing::UnitTest::GetInstance()->listeners().Append(new CaseClockListener);
   return true;
 }();
 }  // namespace
