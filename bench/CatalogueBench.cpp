@@ -1,5 +1,6 @@
 // Costs of the drawing catalogue: scanning a large folder against a bare directory listing,
-// sorting a large catalogue by each key, and the memory one record takes.
+// sorting a large catalogue by each key, and the memory one record takes, counted in a pass of
+// its own.
 // Prints one figure a line: name value unit.
 #include "BenchClock.h"
 #include "catalogue/DwgData.h"
@@ -7,6 +8,8 @@
 #include "catalogue/Ordering.h"
 
 #include <windows.h>
+
+#include <malloc.h>
 
 #include <algorithm>
 #include <atomic>
@@ -17,24 +20,23 @@
 #include <string>
 #include <vector>
 
-// Live heap bytes handed out by operator new: the catalogue's array and its names' text both
-// come from it. Counts the sizes asked for, not the C heap's own bookkeeping per block.
+// Live heap bytes handed out by operator new while the memory pass counts them: the catalogue's
+// array and its names' text both come from it. The sizes are the C heap's for each block (the
+// sizes asked for), not its own bookkeeping. Outside that pass nothing is counted, so that no
+// timing pays for it.
 namespace {
+std::atomic<bool> g_counting{false};
 std::atomic<long long> g_liveBytes{0};
-const std::size_t kHeader = 16;  // keeps the caller's block 16-byte aligned
 
 void *CountedAllocate(std::size_t size) {
-  void *block = std::malloc(size + kHeader);
+  void *block = std::malloc(size ? size : 1);
   if (!block) throw std::bad_alloc();
-  *static_cast<std::size_t *>(block) = size;
-  g_liveBytes += static_cast<long long>(size);
-  return static_cast<char *>(block) + kHeader;
+  if (g_counting) g_liveBytes += static_cast<long long>(_msize(block));
+  return block;
 }
 
-void CountedFree(void *pointer) {
-  if (!pointer) return;
-  void *block = static_cast<char *>(pointer) - kHeader;
-  g_liveBytes -= static_cast<long long>(*static_cast<std::size_t *>(block));
+void CountedFree(void *block) {
+  if (block && g_counting) g_liveBytes -= static_cast<long long>(_msize(block));
   std::free(block);
 }
 }  // namespace
@@ -104,15 +106,24 @@ void BenchScan() {
   EmptyCatalogue();
 }
 
-void BenchMemory() {
-  EmptyCatalogue();
-  const long long before = g_liveBytes;
-  const double start = NowMs();
+// The folder of drawings only: timed as the mixed folder is, after a first scan, best of the
+// rounds; then scanned once more with the heap counted, for the bytes a record takes.
+void BenchDrawings() {
   ScanFolder(kDrawingFolder, ".dwg");
-  const double scanMs = NowMs() - start;
-  const long long bytes = g_liveBytes - before;
+  double best = 1e300;
+  for (int round = 0; round < kRounds; ++round) {
+    const double start = NowMs();
+    ScanFolder(kDrawingFolder, ".dwg");
+    best = std::min(best, NowMs() - start);
+  }
+  EmptyCatalogue();
+
+  g_counting = true;
+  ScanFolder(kDrawingFolder, ".dwg");
+  g_counting = false;
+  const long long bytes = g_liveBytes;
   const int count = g_pCatalogue->GetSize();
-  std::printf("scan_100k_drawings_ms %.1f ms\n", scanMs);
+  std::printf("scan_100k_drawings_ms %.1f ms\n", best);
   std::printf("catalogue_bytes_per_record %.1f bytes\n", count ? static_cast<double>(bytes) / count : 0.0);
   std::fprintf(stderr, "%d records, %lld bytes live, sizeof(DwgData) %zu\n", count, bytes, sizeof(DwgData));
   EmptyCatalogue();
@@ -151,6 +162,6 @@ int main() {
   if (!FolderReady(kMixedFolder) || !FolderReady(kDrawingFolder)) return 1;
   BenchScan();
   BenchSort();
-  BenchMemory();
+  BenchDrawings();
   return 0;
 }

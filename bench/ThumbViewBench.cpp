@@ -114,6 +114,14 @@ double BareRowMs(HWND parent, int firstRecord, int rowStep) {
   return NowMs() - start;
 }
 
+// The bare canvas lies where the frame lies: each is shown only while it is measured, so that
+// neither clips the other's painting.
+void ShowOnly(HWND shown, HWND hidden) {
+  ShowWindow(hidden, SW_HIDE);
+  ShowWindow(shown, SW_SHOWNA);
+  RedrawWindow(shown, nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_ALLCHILDREN | RDW_UPDATENOW);
+}
+
 HWND FindFrame() {
   for (int waited = 0; waited < 60000; waited += 50) {
     if (HWND frame = FindWindowA("FwFrame128", nullptr); frame && IsWindowVisible(frame)) return frame;
@@ -144,9 +152,10 @@ void Measure(HWND frame) {
 
   // First screen after a rescan, against the bare scan and the bare cold paint of its previews.
   std::vector<double> reload, bare;
-  HWND canvas = CreateWindowExA(0, "STATIC", "", WS_POPUP | WS_VISIBLE, 0, 0, 1100, kVisibleRows * rowStep, nullptr, nullptr,
+  HWND canvas = CreateWindowExA(WS_EX_TOPMOST, "STATIC", "", WS_POPUP, 0, 0, 1100, kVisibleRows * rowStep, nullptr, nullptr,
                                 nullptr, nullptr);
   for (int round = 0; round < 3; ++round) {
+    ShowOnly(frame, canvas);
     devhostPreviewClearCache();
     const unsigned long decoded = devhostPreviewDecodeCount();
     double start = NowMs();
@@ -155,6 +164,7 @@ void Measure(HWND frame) {
     reload.push_back(NowMs() - start);
     SendMessageA(view, WM_NULL, 0, 0);
 
+    ShowOnly(canvas, frame);
     devhostPreviewClearCache();
     start = NowMs();
     ScanFolder(kFolder, ".dwg");
@@ -170,6 +180,7 @@ void Measure(HWND frame) {
   }
 
   // Line steps downwards: every row that comes into view is decoded for the first time.
+  ShowOnly(frame, canvas);
   devhostPreviewClearCache();
   std::vector<double> cold, warm, bareRows;
   for (int i = 0; i < kSteps; ++i) {
@@ -183,10 +194,12 @@ void Measure(HWND frame) {
     SendMessageA(view, WM_VSCROLL, i % 2 ? SB_LINEDOWN : SB_LINEUP, 0);
     warm.push_back(NowMs() - start);
   }
+  ShowOnly(canvas, frame);
   for (int i = 0; i < kSteps; ++i) {
     devhostPreviewClearCache();
     bareRows.push_back(BareRowMs(canvas, (kVisibleRows + i) * kColumns, rowStep));
   }
+  ShowOnly(frame, canvas);
   DestroyWindow(canvas);
 
   // Decoded previews the painter keeps hold GDI objects of their own: counted without them.

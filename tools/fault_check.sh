@@ -59,23 +59,52 @@ build_tests() {
   cmake --build build/win64 --target Lumvex1 devhost devhostrt ClipboardTestReader "${win_programs[@]}" >/dev/null 2>&1
 }
 
-# Runs the tests but the fuzz targets; prints the failing cases, one a line.
+# Reads ctest's output (with --output-on-failure) and prints what failed, one a line:
+#   PROGRAM<tab>KIND<tab>CASE
+# A GoogleTest case that failed is an assertion, one the case time limit ended is a timeout; a
+# case that began and never ended is a crash, or a timeout when ctest's limit ended its program.
+# A failed program with no failing case of its own is listed as "ctest: PROGRAM".
+classify() {
+  # Programs may write any bytes; only printable text can name a case.
+  tr -cd '\11\12\40-\176' | LC_ALL=C awk -v OFS='\t' '
+    function flush() {
+      if (program == "" || status == "passed") return
+      if (running != "") found(running, status == "timeout" ? "timeout" : "crash")
+      if (!count) found("ctest: " program, status == "timeout" ? "timeout" : "crash")
+    }
+    function found(name, kind) {
+      if ((program, name) in seen) return
+      seen[program, name] = 1
+      count++
+      print program, kind, name
+    }
+    /^ *[0-9]+\/[0-9]+ Test +#[0-9]+: / {
+      flush()
+      program = $4; running = ""; count = 0
+      status = /\*\*\*Timeout/ ? "timeout" : /\*\*\*Exception/ ? "crash" : /\*\*\*Failed/ ? "failed" : "passed"
+      next
+    }
+    /^\[ RUN      \] / { running = $4; next }
+    /^\[       OK \] / { if ($4 == running) running = ""; next }
+    /^\[ TIMEOUT  \] / { if ($4 == running) running = ""; found($4, "timeout"); next }
+    /^\[  FAILED  \] [A-Za-z0-9_\/]+\.[A-Za-z0-9_\/]+/ { if ($4 == running) running = ""; found($4, "assertion"); next }
+    /^FAILED / { sub(/^FAILED /, ""); found("e2e: " $0, "assertion"); next }
+    END { flush() }
+  '
+}
+
+# Runs the tests but the fuzz targets, or only the programs named by an extended regular
+# expression; prints what failed, as classify does.
 failing_cases() {
-  local out
+  local out filter=("${ctest_filter[@]}")
+  [ $# -gt 0 ] && filter=(-R "$1")
   out=$(mktemp)
   : >"$out"
-  [ $native_run = yes ] && ctest --test-dir build/native -LE fuzz "${ctest_filter[@]}" --output-on-failure -j2 >>"$out" 2>&1
+  [ $native_run = yes ] && ctest --test-dir build/native -LE fuzz "${filter[@]}" --output-on-failure -j2 >>"$out" 2>&1
   if [ ${#win_programs[@]} -gt 0 ] || [ $e2e_run = yes ]; then
-    ctest --test-dir build/win64 "${ctest_filter[@]}" --output-on-failure >>"$out" 2>&1
+    ctest --test-dir build/win64 "${filter[@]}" --output-on-failure >>"$out" 2>&1
   fi
-  {
-    # GoogleTest cases; the summary repeats them with a count first.
-    sed -n 's/^\[  FAILED  \] \([A-Za-z0-9_/]*\.[A-Za-z0-9_/]*\).*/\1/p' "$out"
-    # End-to-end checks.
-    sed -n 's/^FAILED \(.*\)$/e2e: \1/p' "$out"
-    # The test programs that failed: alone, they tell of a crash or a sanitizer report.
-    sed -n 's/^ *[0-9]*\/[0-9]* Test *#[0-9]*: \([^ ]*\) \.*\*\*\*.*/ctest: \1/p' "$out"
-  } | sort -u
+  classify <"$out" | sort -u
   rm -f "$out"
 }
 
@@ -104,10 +133,10 @@ trap 'exit 130' INT TERM
 
 log "clean run"
 baseline=$(failing_cases)
-[ -n "$baseline" ] && log "failing without a fault (left out of the results): $(echo $baseline)"
+[ -n "$baseline" ] && log "failing without a fault (left out of the results): $(echo "$baseline" | cut -f3 | paste -sd, -)"
 
 mkdir -p "$(dirname "$results")"
-: >"$results"
+echo "$(date -u '+%Y-%m-%d %H:%M UTC'), commit $(git rev-parse --short HEAD)" >"$results"
 for fault in "${faults[@]}"; do
   patch="tools/faults/$fault.patch"
   if ! git apply "$patch"; then
@@ -116,14 +145,26 @@ for fault in "${faults[@]}"; do
   fi
   applied=$fault
   log "$fault"
+  line="$fault: NOT CAUGHT"
+  caught=""
   if ! build_tests; then
     line="$fault: does not build"
   else
-    caught=$(comm -23 <(failing_cases) <(echo "$baseline" | sort -u) | paste -sd, - | sed 's/,/, /g')
-    if [ -n "$caught" ]; then line="$fault: caught by $caught"; else line="$fault: NOT CAUGHT"; fi
+    caught=$(failing_cases | awk -F'\t' 'NR == FNR { clean[$1, $3] = 1; next } !(($1, $3) in clean)' <(echo "$baseline") -)
   fi
   git apply -R "$patch"
   applied=""
+  if [ -n "$caught" ]; then
+    # The catching programs again, on the clean tree: what fails there as well is no catch.
+    build_tests
+    programs_re="^($(echo "$caught" | cut -f1 | sort -u | paste -sd'|' -))\$"
+    flaky=$(comm -12 <(echo "$caught" | cut -f1,3 | sort -u) <(failing_cases "$programs_re" | cut -f1,3 | sort -u))
+    counted=$(echo "$caught" | while IFS=$'\t' read -r program kind name; do
+      grep -qxF "$program"$'\t'"$name" <<<"$flaky" || echo "$name ($kind)"
+    done | paste -sd, - | sed 's/,/, /g')
+    [ -n "$counted" ] && line="$fault: caught by $counted"
+    [ -n "$flaky" ] && line="$line; failing on the clean tree too, not counted: $(echo "$flaky" | cut -f2 | paste -sd, - | sed 's/,/, /g')"
+  fi
   echo "$line" | tee -a "$results"
 done
 # Leave the builds matching the clean tree.

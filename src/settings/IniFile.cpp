@@ -96,15 +96,18 @@ bool CIniFile::Load() {
     m_error = kOpenError;
     return false;
   }
+  LoadFrom(file.get());
+  return true;
+}
 
+void CIniFile::LoadFrom(std::FILE *file) {
   std::string currentSection;
   std::string line;
   line.reserve(kLineBudget);
   // A line too long to keep is left out, and the lines after it still count: a file edited
   // by hand loses no setting that follows such a line.
-  for (LineRead read; (read = ReadLine(file.get(), line)) != LineRead::End;)
+  for (LineRead read; (read = ReadLine(file, line)) != LineRead::End;)
     if (read == LineRead::Line) ParseLine(line, currentSection);
-  return true;
 }
 
 void CIniFile::ParseLine(const std::string &line, std::string &currentSection) {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdio>
 #include <string>
 #include <vector>
 
@@ -24,6 +25,9 @@ class CIniFile {
   bool Load();
   // False when the file could not be written; it is then left as it was.
   bool Save();
+  // What Load takes from the file and what Save writes, without the file.
+  void LoadFrom(std::FILE *file);
+  std::string Serialize() const;
 
   std::string GetString(std::string section, std::string name);
   bool SetString(std::string section, std::string name, std::string value, bool create);
@@ -48,5 +52,4 @@ class CIniFile {
 
  private:
   void ParseLine(const std::string &line, std::string &currentSection);
-  std::string Serialize() const;
 };

@@ -2,6 +2,7 @@
 // looks at it and acts on it as a person would, then reads the LISP result.
 #pragma once
 
+#include "CaseTimeLimit.h"
 #include "ModuleHarness.h"
 
 #include <windows.h>
@@ -9,6 +10,9 @@
 #include <ole2.h>
 #include <shlobj.h>
 
+#include <atomic>
+#include <cstdio>
+#include <cstring>
 #include <fstream>
 #include <functional>
 #include <sstream>
@@ -49,12 +53,55 @@ class StateFileGuard {
   std::string m_content;
 };
 
+#if __has_include(<gtest/gtest.h>)  // the benchmarks that share this header build without gtest
+#include <gtest/gtest.h>
+inline void WaitGaveUp(const std::string &what) { ADD_FAILURE() << "gave up waiting for " << what; }
+#else
+inline void WaitGaveUp(const std::string &what) { std::fprintf(stderr, "gave up waiting for %s\n", what.c_str()); }
+#endif
+
+// A visible top-level window of this process with the class and, unless null, the title: other
+// programs on the same display may show windows of the same kind at any time. Null, and a
+// failed case, when none comes within the time.
 inline HWND WaitForWindow(const char *className, const char *title, int milliseconds = 15000) {
+  const std::string what = std::string("a window of class ") + className + (title ? std::string(" titled ") + title : "");
+  const WaitingFor waiting(what);
+  struct Search {
+    const char *className, *title;
+    HWND found;
+  } search{className, title, nullptr};
   for (int waited = 0; waited < milliseconds; waited += 50) {
-    if (HWND hwnd = FindWindowA(className, title); hwnd && IsWindowVisible(hwnd)) return hwnd;
+    EnumWindows(
+        [](HWND hwnd, LPARAM param) {
+          auto *search = reinterpret_cast<Search *>(param);
+          DWORD process = 0;
+          GetWindowThreadProcessId(hwnd, &process);
+          char name[64] = "";
+          GetClassNameA(hwnd, name, sizeof name);
+          if (process != GetCurrentProcessId() || !IsWindowVisible(hwnd) || std::strcmp(name, search->className) != 0)
+            return TRUE;
+          // The title as the window keeps it: asking the window would wait for its thread.
+          wchar_t text[256] = L"";
+          InternalGetWindowText(hwnd, text, 256);
+          if (search->title && std::wstring(text) != std::wstring(search->title, search->title + std::strlen(search->title)))
+            return TRUE;
+          search->found = hwnd;
+          return FALSE;
+        },
+        reinterpret_cast<LPARAM>(&search));
+    if (search.found) return search.found;
     Sleep(50);
   }
+  WaitGaveUp(what);
   return nullptr;
+}
+
+// The popup menu this process opens, or null and a failed case; a menu that shows only after
+// the wait is closed, so that its loop cannot hold the test.
+inline HWND WaitForPopupMenu() {
+  HWND menu = WaitForWindow("#32768", nullptr, 5000);
+  if (!menu) EndMenu();
+  return menu;
 }
 
 // The frame once the explorer has started: its thread answers only when back in its message
@@ -110,14 +157,26 @@ struct BrowseOutcome {
   bool watcherFoundFrame = false;
 };
 
+// When no frame shows, the watcher closes whatever the call shows instead until it returns.
 inline BrowseOutcome Browse(resbuf *args, const std::function<void(HWND frame)> &watcher) {
   BrowseOutcome outcome;
+  const DWORD caller = GetCurrentThreadId();
+  std::atomic<bool> returned{false};
   std::thread watch([&] {
     HWND frame = WaitForFrame();
     outcome.watcherFoundFrame = frame != nullptr;
-    if (frame) watcher(frame);
+    if (frame) return watcher(frame);
+    const WaitingFor waiting("the browse call to return after its windows were closed");
+    while (!returned) {
+      EnumThreadWindows(caller, [](HWND hwnd, LPARAM) { return PostMessageA(hwnd, WM_CLOSE, 0, 0), TRUE; }, 0);
+      Sleep(100);
+    }
   });
-  devhostInvoke(L"Lumvex", args);
+  {
+    const WaitingFor waiting("the browse call to return");
+    devhostInvoke(L"Lumvex", args);
+  }
+  returned = true;
   watch.join();
   outcome.resultKind = devhostResultKind();
   resbuf *result = devhostResultCopy();
@@ -134,9 +193,7 @@ inline resbuf *BrowseArgs(const wchar_t *folder, const wchar_t *accept = L"Inser
   return acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, folder, RTSTR, accept, RTSTR, cancel, 0);
 }
 
-#if __has_include(<gtest/gtest.h>)  // the benchmarks that share this header build without gtest
-#include <gtest/gtest.h>
-
+#if __has_include(<gtest/gtest.h>)
 // Browse calls of the module loaded into the host, with OLE initialised on the host's thread as
 // the CAD application has it, and the state file as it was before the test.
 class BrowseTest : public ::testing::Test {

@@ -19,6 +19,9 @@ namespace {
 using fwtest::Log;
 using fwtest::Pump;
 
+// The commands of the test's tool bar resource.
+constexpr UINT kFirst = 101, kSecond = 102, kThird = 103, kSlot = 106;
+
 std::string NotificationName(UINT code) {
   switch (code) {
     case TVN_SELCHANGINGA:
@@ -113,7 +116,7 @@ class ToolBarTest : public ::testing::Test {
 
 TEST_F(ToolBarTest, ButtonsSeparatorsAndPicturesComeFromTheResourceAndASeparatorWidens) {
   ASSERT_EQ(11, bar.GetCount());
-  EXPECT_EQ(9, bar.CommandToIndex(32790));
+  EXPECT_EQ(9, bar.CommandToIndex(kSlot));
   EXPECT_EQ(-1, bar.CommandToIndex(4711));
   // The buttons' pictures are the resource's 16 x 20 images, one per button.
   HIMAGELIST images = reinterpret_cast<HIMAGELIST>(bar.SendMessage(TB_GETIMAGELIST));
@@ -123,13 +126,13 @@ TEST_F(ToolBarTest, ButtonsSeparatorsAndPicturesComeFromTheResourceAndASeparator
   EXPECT_EQ(7, ImageList_GetImageCount(images));
 
   // A separator widened to make room for a child control keeps its command.
-  bar.SetButtonInfo(9, 32790, fw::TBBS_SEPARATOR, 125);
+  bar.SetButtonInfo(9, kSlot, fw::TBBS_SEPARATOR, 125);
   RECT slot{}, next{};
   bar.GetItemRect(9, &slot);
   bar.GetItemRect(10, &next);
   EXPECT_EQ(125, slot.right - slot.left);
   EXPECT_EQ(slot.right, next.left);
-  EXPECT_EQ(9, bar.CommandToIndex(32790));
+  EXPECT_EQ(9, bar.CommandToIndex(kSlot));
 }
 
 TEST_F(ToolBarTest, PointingAtButtonsShowsTheirPromptsUntilThePointerLeaves) {
@@ -141,16 +144,16 @@ TEST_F(ToolBarTest, PointingAtButtonsShowsTheirPromptsUntilThePointerLeaves) {
   fwtest::MouseTo(fwtest::ScreenPoint(bar, (second.left + second.right) / 2, (second.top + second.bottom) / 2));
   fwtest::MouseTo(fwtest::ScreenPoint(parent, 300, 300));
   Pump(600);  // leaving is noticed on the window system's mouse tracking timer
-  EXPECT_EQ((Log{"prompt 32771", "prompt 32774", "prompt " + std::to_string(AFX_IDS_IDLEMESSAGE)}), parent.log);
+  EXPECT_EQ((Log{"prompt " + std::to_string(kFirst), "prompt " + std::to_string(kSecond), "prompt " + std::to_string(AFX_IDS_IDLEMESSAGE)}), parent.log);
 }
 
 TEST_F(ToolBarTest, IdleUpdateRunsHandlersAndLeavesOtherButtonsAsTheyWere) {
-  bar.EnableButton(32771, FALSE);  // set directly, as the frame does for its accept button
-  parent.disabledCommands = {32774};
+  bar.EnableButton(kFirst, FALSE);  // set directly, as the frame does for its accept button
+  parent.disabledCommands = {kSecond};
   bar.OnUpdateCmdUI(&parent);
-  EXPECT_FALSE(bar.IsButtonEnabled(32771));
-  EXPECT_FALSE(bar.IsButtonEnabled(32774));
-  EXPECT_TRUE(bar.IsButtonEnabled(32775));
+  EXPECT_FALSE(bar.IsButtonEnabled(kFirst));
+  EXPECT_FALSE(bar.IsButtonEnabled(kSecond));
+  EXPECT_TRUE(bar.IsButtonEnabled(kThird));
 }
 
 class StatusBarTest : public ::testing::Test {

@@ -2,8 +2,10 @@
 // pumping, and mouse input that the window system delivers as a person's would.
 #pragma once
 
+#include "CaseTimeLimit.h"
 #include "fw/Wnd.h"
 
+#include <gtest/gtest.h>
 #include <windows.h>
 
 #include <cstdlib>
@@ -27,16 +29,19 @@ inline void Pump(DWORD milliseconds = 50) {
   } while (GetTickCount() - start < milliseconds);
 }
 
-// Pumps messages until `done` holds or about a second has passed; input reaches the window
-// system's queue at its own pace on a busy machine.
+// Pumps messages until `done` holds; input reaches the window system's queue at its own pace on
+// a busy machine, but a condition that has not come after five seconds fails the case.
 template <class Condition>
-bool PumpUntil(Condition done) {
+void PumpUntil(const char *what, Condition done) {
+  const WaitingFor waiting(what);
   const DWORD start = GetTickCount();
   while (!done()) {
-    if (GetTickCount() - start > 1000) return false;
+    if (GetTickCount() - start > 5000) {
+      ADD_FAILURE() << "gave up waiting for " << what;
+      return;
+    }
     Pump(10);
   }
-  return true;
 }
 
 inline POINT CursorPosition() {
@@ -67,7 +72,7 @@ inline void MouseTo(POINT screen) {
   input.mi.dy = (screen.y * 65536 + GetSystemMetrics(SM_CYSCREEN) / 2) / GetSystemMetrics(SM_CYSCREEN);
   input.mi.dwFlags = MOUSEEVENTF_MOVE | MOUSEEVENTF_ABSOLUTE;
   SendInput(1, &input, sizeof(input));
-  PumpUntil([&] {
+  PumpUntil("the pointer to reach its point", [&] {
     const POINT now = CursorPosition();
     return abs(now.x - screen.x) <= 1 && abs(now.y - screen.y) <= 1;
   });
@@ -81,7 +86,8 @@ inline void MouseButton(bool down) {
   input.type = INPUT_MOUSE;
   input.mi.dwFlags = down ? MOUSEEVENTF_LEFTDOWN : MOUSEEVENTF_LEFTUP;
   SendInput(1, &input, sizeof(input));
-  PumpUntil([&] { return (GetKeyState(VK_LBUTTON) < 0) == down; });
+  PumpUntil(down ? "the left button to be down" : "the left button to be up",
+            [&] { return (GetKeyState(VK_LBUTTON) < 0) == down; });
   Pump();
 }
 

@@ -1,5 +1,6 @@
-// The module's resources as its callers load them: menus, accelerators, strings, the dialogs'
-// controls, icons and the animated loading cursor.
+// The module's resources as its code and its callers rely on them: the commands its menus
+// offer, the accelerators, the texts looked for, the dialogs' controls, icons and the animated
+// loading cursor.
 #include "ModuleHarness.h"
 #include "res/resource.h"
 
@@ -23,61 +24,34 @@ HMODULE Module() {
   return module;
 }
 
-// One menu entry as a person sees it: id (0 for a separator, -1 for a submenu) and text.
-using Entry = std::pair<int, std::wstring>;
-
-std::vector<Entry> Entries(HMENU menu) {
-  std::vector<Entry> entries;
+// The commands of a menu and its submenus.
+std::set<int> Commands(HMENU menu) {
+  std::set<int> commands;
   for (int i = 0; i < GetMenuItemCount(menu); ++i) {
-    wchar_t text[128] = L"";
-    MENUITEMINFOW info{};
-    info.cbSize = sizeof info;
-    info.fMask = MIIM_FTYPE | MIIM_ID | MIIM_STRING | MIIM_SUBMENU;
-    info.dwTypeData = text;
-    info.cch = 128;
-    GetMenuItemInfoW(menu, i, TRUE, &info);
-    const int id = (info.fType & MFT_SEPARATOR) ? 0 : info.hSubMenu ? -1 : static_cast<int>(info.wID);
-    entries.emplace_back(id, text);
+    if (HMENU submenu = GetSubMenu(menu, i)) {
+      const std::set<int> inner = Commands(submenu);
+      commands.insert(inner.begin(), inner.end());
+    } else if (const UINT id = GetMenuItemID(menu, i); id != 0 && id != 0xFFFFFFFFu) {
+      commands.insert(static_cast<int>(id));
+    }
   }
-  return entries;
+  return commands;
 }
 
-TEST(Menus, FrameMenuOffersEveryCommandUnderItsHeading) {
-  const HMENU menu = LoadMenuW(Module(), MAKEINTRESOURCEW(128));
-  ASSERT_TRUE(menu);
-  EXPECT_EQ(Entries(menu), (std::vector<Entry>{{-1, L"&File"}, {-1, L"&View"}, {-1, L"&Sort"}, {-1, L"&Help"}}));
-
-  EXPECT_EQ(Entries(GetSubMenu(menu, 0)), (std::vector<Entry>{{57665, L"E&xit"}}));
-  EXPECT_EQ(Entries(GetSubMenu(menu, 1)), (std::vector<Entry>{{32771, L"&Begin"},
-                                                              {32774, L"&Increase"},
-                                                              {32775, L"&Decrease"},
-                                                              {32782, L"&Aligne"},
-                                                              {0, L""},
-                                                              {59392, L"&Toolbar"},
-                                                              {59393, L"&Status Bar"}}));
-  EXPECT_EQ(Entries(GetSubMenu(menu, 2)), (std::vector<Entry>{{32799, L"By &Name"}, {32788, L"By &Date"}, {32789, L"By &Size"}}));
-  EXPECT_EQ(Entries(GetSubMenu(menu, 3)), (std::vector<Entry>{{57664, L"&About"}, {57670, L"&Help"}}));
-}
-
-TEST(Menus, TileMenuIsOnePopupWithFileCommandsSortAndProperty) {
-  const HMENU menu = LoadMenuW(Module(), MAKEINTRESOURCEW(208));
-  ASSERT_TRUE(menu);
-  ASSERT_EQ(GetMenuItemCount(menu), 1);
-  HMENU popup = GetSubMenu(menu, 0);
-  EXPECT_EQ(Entries(popup), (std::vector<Entry>{{32797, L"&Copy"},
-                                                {32800, L"&Delete"},
-                                                {32801, L"&Paste"},
-                                                {32802, L"&Rename"},
-                                                {0, L""},
-                                                {-1, L"&Sort"},
-                                                {0, L""},
-                                                {32803, L"Property"}}));
-  EXPECT_EQ(Entries(GetSubMenu(popup, 5)),
-            (std::vector<Entry>{{32799, L"&By Name"}, {32788, L"By &Date"}, {32789, L"By &Size"}}));
+// The menus offer exactly the commands the frame and the tile handle.
+TEST(Menus, OfferTheCommandsTheExplorerHandles) {
+  const HMENU frame = LoadMenuW(Module(), MAKEINTRESOURCEW(IDR_MAINFRAME)), tile = LoadMenuW(Module(), MAKEINTRESOURCEW(IDR_TILE_MENU));
+  ASSERT_TRUE(frame && tile);
+  EXPECT_EQ(Commands(frame), (std::set<int>{ID_APP_EXIT, ID_VIEW_BEGIN, ID_VIEW_INCREASE, ID_VIEW_DECREASE, ID_VIEW_ALIGNE,
+                                            ID_VIEW_TOOLBAR, ID_VIEW_STATUS_BAR, ID_SORT_BY_NAME, ID_SORT_BY_DATE,
+                                            ID_SORT_BY_SIZE, ID_APP_ABOUT, ID_HELP}));
+  ASSERT_EQ(GetMenuItemCount(tile), 1) << "one popup, the one the tile opens";
+  EXPECT_EQ(Commands(tile), (std::set<int>{ID_TILE_COPY, ID_TILE_DELETE, ID_TILE_PASTE, ID_TILE_RENAME, ID_SORT_BY_NAME,
+                                           ID_SORT_BY_DATE, ID_SORT_BY_SIZE, ID_TILE_PROPERTY}));
 }
 
 TEST(Accelerators, FrameTableMapsEveryKeyToItsCommand) {
-  HACCEL table = LoadAcceleratorsW(Module(), MAKEINTRESOURCEW(128));
+  HACCEL table = LoadAcceleratorsW(Module(), MAKEINTRESOURCEW(IDR_MAINFRAME));
   ASSERT_TRUE(table);
   std::vector<ACCEL> entries(CopyAcceleratorTableW(table, nullptr, 0));
   CopyAcceleratorTableW(table, entries.data(), static_cast<int>(entries.size()));
@@ -89,10 +63,12 @@ TEST(Accelerators, FrameTableMapsEveryKeyToItsCommand) {
     actual.insert({a.fVirt & (FSHIFT | FCONTROL | FALT), a.key, a.cmd});
   }
   const std::set<Key> expected = {
-      {FCONTROL, 'C', 57634}, {FCONTROL, VK_INSERT, 57634}, {FCONTROL, 'V', 57637}, {FSHIFT, VK_INSERT, 57637},
-      {FCONTROL, 'X', 57635}, {FSHIFT, VK_DELETE, 57635},   {FCONTROL, 'A', 32793}, {0, VK_DELETE, 32794},
-      {0, VK_F6, 57680},      {FSHIFT, VK_F6, 57681},       {FCONTROL, 'O', 57601}, {FCONTROL, 'P', 57607},
-      {FCONTROL, 'N', 57600}, {FCONTROL, 'S', 57603},       {FCONTROL, 'Z', 57643}, {FALT, VK_BACK, 57643},
+      {FCONTROL, 'C', ID_EDIT_COPY},  {FCONTROL, VK_INSERT, ID_EDIT_COPY}, {FCONTROL, 'V', ID_EDIT_PASTE},
+      {FSHIFT, VK_INSERT, ID_EDIT_PASTE}, {FCONTROL, 'X', ID_EDIT_CUT},     {FSHIFT, VK_DELETE, ID_EDIT_CUT},
+      {FCONTROL, 'A', ID_MARK_ALL},   {0, VK_DELETE, ID_CLEAR_FOCUSED_EDIT}, {0, VK_F6, ID_NEXT_PANE},
+      {FSHIFT, VK_F6, ID_PREV_PANE},  {FCONTROL, 'O', ID_FILE_OPEN},        {FCONTROL, 'P', ID_FILE_PRINT},
+      {FCONTROL, 'N', ID_FILE_NEW},   {FCONTROL, 'S', ID_FILE_SAVE},        {FCONTROL, 'Z', ID_EDIT_UNDO},
+      {FALT, VK_BACK, ID_EDIT_UNDO},
   };
   EXPECT_EQ(actual, expected);
   EXPECT_EQ(entries.size(), expected.size());
@@ -105,24 +81,11 @@ std::wstring String(UINT id) {
   return std::wstring(text, length);
 }
 
-TEST(Strings, PromptsToolTipsTitleAndStatusBarTexts) {
-  EXPECT_EQ(String(32771), L"Scroll to begin\nScroll to begin");
-  EXPECT_EQ(String(32774), L"Increase\nIncrease");
-  EXPECT_EQ(String(32775), L"Decrease\nDecrease");
-  EXPECT_EQ(String(32782), L"Aligne\nAligne");
-  EXPECT_EQ(String(32799), L"Sort by name\nSort by name");
-  EXPECT_EQ(String(32788), L"Sort by date\nSort by date");
-  EXPECT_EQ(String(32789), L"Sort by size\nSort by size");
-  EXPECT_EQ(String(57634), L"Copy the selection and put it on the Clipboard\nCopy");
-  EXPECT_EQ(String(57637), L"Insert Clipboard contents\nPaste");
-  EXPECT_EQ(String(57635), L"Cut the selection and put it on the Clipboard\nCut");
-
-  const std::wstring title = String(128);
+// The texts scripts and the frame look for: the title that finds a frame, the idle prompt.
+TEST(Strings, TitleAndIdlePrompt) {
+  const std::wstring title = String(IDR_MAINFRAME);
   EXPECT_EQ(title.substr(0, title.find(L'\n')), L"ombra3") << "the frame's title until a folder is shown";
-  EXPECT_EQ(String(0xE001), L"Ready");
-  EXPECT_EQ(String(0xE701), L"CAP");
-  EXPECT_EQ(String(0xE702), L"NUM");
-  EXPECT_EQ(String(0xE703), L"SCRL");
+  EXPECT_EQ(String(AFX_IDS_IDLEMESSAGE), L"Ready");
 }
 
 // A dialog of the module as the dialog manager builds it from the template, hidden: its title
@@ -149,6 +112,30 @@ std::vector<Control> Controls(int id, std::wstring &title) {
   }
   DestroyWindow(dialog);
   return controls;
+}
+
+std::ostream &operator<<(std::ostream &out, const Control &c) {
+  return out << c.id << " " << std::string(c.windowClass.begin(), c.windowClass.end()) << " "
+             << std::string(c.text.begin(), c.text.end());
+}
+
+// The controls the dialog's code reaches by id, of the classes it treats them as, and the
+// captions of its two ways out.
+TEST(Dialogs, FolderSettingsControlsTheCodeUses) {
+  std::wstring title;
+  std::vector<Control> used;
+  for (const Control &c : Controls(IDD_FOLDER_SETTINGS, title))
+    if (c.id != IDC_STATIC) used.push_back(c);
+  EXPECT_EQ(title, L"Folder settings");
+  const std::vector<Control> expected = {
+      {IDC_USE_CURRENT_LAYER, L"Button", L"&Use current layer", 0}, {IDC_LAYER_NAME, L"Edit", L"", 0},
+      {IDC_COLOR_SWATCH, L"Static", L"", 0}, {IDC_LISP_COMMAND, L"Edit", L"", 0},
+      {IDOK, L"Button", L"&Accept", 0},           {IDCANCEL, L"Button", L"&Cancel", 0},
+  };
+  ASSERT_EQ(used, expected);
+  EXPECT_EQ(used[0].style & 0xF, static_cast<DWORD>(BS_AUTOCHECKBOX));
+  EXPECT_TRUE(used[2].style & SS_NOTIFY) << "the swatch reports clicks";
+  EXPECT_EQ(used[4].style & 0xF, static_cast<DWORD>(BS_DEFPUSHBUTTON));
 }
 
 TEST(Dialogs, AboutBoxShowsTheIconTheModuleNameAndAWayToCloseAndTheIconsAndCursorLoad) {

@@ -87,10 +87,14 @@ std::vector<std::string> Drawings(int first, int count, int records) {
 // (limits of the search box's text) have arrived: a thread takes its posted messages in order.
 void Sync(HWND frame) {
   static WPARAM marker = 100000;
+  const WaitingFor waiting("the view's thread to take the messages posted to it");
   for (int round = 0; round < 2; ++round) {
     PostMessageA(SearchBox(frame), EM_SETLIMITTEXT, ++marker, 0);
-    for (int waited = 0; waited < 10000 && WPARAM(SendMessageA(SearchBox(frame), EM_GETLIMITTEXT, 0, 0)) != marker; ++waited)
+    const DWORD start = GetTickCount();
+    while (WPARAM(SendMessageA(SearchBox(frame), EM_GETLIMITTEXT, 0, 0)) != marker) {
+      ASSERT_LT(GetTickCount() - start, 10000u) << "the view's thread took no posted message for 10 s";
       Sleep(1);
+    }
   }
 }
 void Post(HWND frame, HWND target, UINT message, WPARAM wParam, LPARAM lParam = 0) {
@@ -105,6 +109,21 @@ void SizeView(HWND frame, int width, int height) {
   GetWindowRect(frame, &window);
   SetWindowPos(frame, nullptr, 0, 0, window.right - window.left + width - client.right,
                window.bottom - window.top + height - client.bottom, SWP_NOMOVE | SWP_NOZORDER);
+}
+
+std::vector<std::string> ClipboardPaths() {
+  std::vector<std::string> paths;
+  if (!OpenClipboard(nullptr)) return {"(the clipboard could not be opened)"};
+  if (HANDLE drop = GetClipboardData(CF_HDROP)) {
+    const UINT count = DragQueryFileA(HDROP(drop), 0xFFFFFFFF, nullptr, 0);
+    for (UINT i = 0; i < count; ++i) {
+      char path[MAX_PATH] = "";
+      DragQueryFileA(HDROP(drop), i, path, MAX_PATH);
+      paths.push_back(path);
+    }
+  }
+  CloseClipboard();
+  return paths;
 }
 
 bool AcceptEnabled(HWND frame) { return SendMessageA(ToolBars(frame)[1], TB_ISBUTTONENABLED, 32795, 0) != 0; }
@@ -155,6 +174,11 @@ TEST_F(ThumbView, KeysWheelAndScrollBarKeepEveryVisibleRowFilled) {
     }
     SendMessageA(SearchBox(frame), WM_SETTEXT, 0, LPARAM("d119"));  // the last row at the top
     EXPECT_EQ(Names(view), Drawings(116, 4, 120));
+    // The ring has wrapped several times: a click marks the drawing the tile shows.
+    for (const Tile &tile : Tiles(view))
+      if (tile.name == "d117.dwg") Post(frame, tile.hwnd, WM_LBUTTONDOWN, MK_LBUTTON);
+    SendMessageA(frame, WM_COMMAND, kCopy, 0);
+    EXPECT_EQ(ClipboardPaths(), std::vector<std::string>{Folder() + "\\d117.dwg"});
   });
 }
 
@@ -260,19 +284,12 @@ TEST_F(ThumbView, PictureSizesStepAndKeepTheTopRowsFirstDrawing) {
 // Answers the context menu with its items' keys and the shell's confirmation with a button.
 std::thread Answer(std::vector<WPARAM> keys, int confirmButton = 0) {
   return std::thread([keys, confirmButton] {
-    HWND menu = WaitForWindow("#32768", nullptr, 5000);
+    HWND menu = WaitForPopupMenu();
+    if (!menu) return;
     for (WPARAM key : keys) PostMessageA(menu, WM_KEYDOWN, key, 0);
     if (HWND confirm = confirmButton ? WaitForWindow("#32770", "Confirm file deletion", 5000) : nullptr)
       SendMessageA(GetDlgItem(confirm, confirmButton), BM_CLICK, 0, 0);
   });
-}
-
-int ClipboardFileCount() {
-  int count = -1;
-  if (!OpenClipboard(nullptr)) return count;
-  if (HANDLE drop = GetClipboardData(CF_HDROP)) count = static_cast<int>(DragQueryFileA(HDROP(drop), 0xFFFFFFFF, nullptr, 0));
-  CloseClipboard();
-  return count;
 }
 
 TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
@@ -296,7 +313,7 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
   MakeDrawings(6);
   const ScratchFolder elsewhere("thumbview-other");
   const std::string other = elsewhere.File("new.dwg", "");
-  int copiedFromMenu = 0, copiedAll = 0;
+  std::vector<std::string> copiedFromMenu, copiedAll;
   Run(4 * 178 + 20, 400, [&](HWND frame, HWND view) {
     std::string title = WindowText(frame);
     for (const Case &c : cases) {
@@ -308,11 +325,11 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
       EXPECT_EQ(Marked(view), c.marked) << c.tile;
       EXPECT_EQ(AcceptEnabled(frame), c.accept) << c.tile;
       EXPECT_EQ(WindowText(frame), title) << c.tile;
-      if (c.menu.size() == 2) copiedFromMenu = ClipboardFileCount();
+      if (c.menu.size() == 2) copiedFromMenu = ClipboardPaths();
     }
     SendMessageA(frame, WM_COMMAND, kMarkAll, 0);
     SendMessageA(frame, WM_COMMAND, kCopy, 0);
-    copiedAll = ClipboardFileCount();
+    copiedAll = ClipboardPaths();
     PutFileOnClipboard(other);
     std::thread answer = Answer({'P'});
     Post(frame, view, WM_RBUTTONDOWN, MK_RBUTTON, MAKELPARAM(4 * 178 + 10, 5));  // the background's &Paste
@@ -320,8 +337,12 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
     Sync(frame);
     EXPECT_EQ(Names(view, false).back(), "new.dwg");
   });
-  EXPECT_EQ(copiedFromMenu, 2);
-  EXPECT_EQ(copiedAll, 6);
+  const auto inFolder = [&](std::vector<std::string> names) {
+    for (std::string &name : names) name = Folder() + "\\" + name;
+    return names;
+  };
+  EXPECT_EQ(copiedFromMenu, inFolder({"d002.dwg", "d003.dwg"}));
+  EXPECT_EQ(copiedAll, inFolder(Drawings(0, 6, 6)));
   EXPECT_EQ(GetFileAttributesA(m_folder.File("d004.dwg").c_str()) != INVALID_FILE_ATTRIBUTES, true);
 }
 

@@ -56,7 +56,7 @@ inline HTREEITEM ChildNamed(HWND tree, HTREEITEM parent, const std::string &text
 // Chooses "&Folder settings" once the menu shows; returns after the menu has closed and its
 // handler has run up to its dialog, if it opens one. False when no menu showed.
 inline bool ChooseFromMenu() {
-  HWND menu = WaitForWindow("#32768", nullptr, 5000);
+  HWND menu = WaitForPopupMenu();
   if (!menu) return false;
   PostMessageA(menu, WM_CHAR, 'f', 0);
   for (int i = 0; i < 250 && IsWindowVisible(menu); ++i) Sleep(20);

@@ -5,15 +5,24 @@
 #include "explorer/ProgressFX.h"
 #include "explorer/WaitingTreeCtrl.h"
 
+#include "CaseTimeLimit.h"
+
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <atomic>
 #include <cstring>
 #include <functional>
 #include <vector>
 
 namespace {
+constexpr DWORD kSlowTickMs = 300;
+
 class RecordingTree : public CWaitingTreeCtrl {
  public:
+  ~RecordingTree() override {
+    if (animationThread) CloseHandle(animationThread);
+  }
   int children = 0;
   bool fillResult = true;
   bool refusePlaceholder = false;
@@ -22,7 +31,10 @@ class RecordingTree : public CWaitingTreeCtrl {
   int fills = 0, waitBegins = 0, placeholders = 0;
   bool placeholderGoneDuringFill = false, threadEndedAtShow = false, handlesClosedAtShow = false;
   RECT placeholderText{};
-  DWORD animationThread = 0;
+  HANDLE animationThread = nullptr;  // opened by the thread itself, so it is a real handle
+  std::atomic<bool> lastStepBegun{false};
+  std::atomic<int> ticksEnded{0};
+  int ticksEndedAtShow = -1;
 
   LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override {
     if (message == TVM_INSERTITEMA && std::strcmp(reinterpret_cast<TVINSERTSTRUCTA *>(lParam)->item.pszText, "Loading...") == 0) {
@@ -31,9 +43,8 @@ class RecordingTree : public CWaitingTreeCtrl {
     }
     if (message == WM_SETREDRAW) redrawOn = wParam != 0;
     if (message == WM_SETREDRAW && wParam && animationThread) {
-      HANDLE thread = OpenThread(SYNCHRONIZE, FALSE, animationThread);
-      threadEndedAtShow = !thread || WaitForSingleObject(thread, 0) == WAIT_OBJECT_0;
-      if (thread) CloseHandle(thread);
+      threadEndedAtShow = WaitForSingleObject(animationThread, 0) == WAIT_OBJECT_0;
+      ticksEndedAtShow = ticksEnded;
       handlesClosedAtShow = !m_hThread && !m_hTickEvent && !m_hProgressEvent;
     }
     return CWaitingTreeCtrl::WindowProc(message, wParam, lParam);
@@ -44,16 +55,27 @@ class RecordingTree : public CWaitingTreeCtrl {
     ++waitBegins;
     GetItemRect(placeholder, &placeholderText, TRUE);
   }
-  void OnWaitTick(bool, int, int) override { animationThread = GetCurrentThreadId(); }
+  // The step that completes the progress is slow: a tree shown before the thread's end would
+  // find it still drawing.
+  void OnWaitTick(bool isTick, int total, int done) override {
+    if (!animationThread) animationThread = OpenThread(SYNCHRONIZE, FALSE, GetCurrentThreadId());
+    if (!isTick && total > 0 && done == total && !lastStepBegun.exchange(true)) Sleep(kSlowTickMs);
+  }
   bool FillItemChildren(HTREEITEM item) override {
     ++fills;
     placeholderGoneDuringFill = GetChildItem(item) == nullptr;
-    SetProgress(0, 0);
+    SetProgress(children, 0);
     for (int i = 0; i < children; ++i, Sleep(60)) {
       InsertItem("child", item);
       StepProgress(1);
     }
     if (duringFill) duringFill();
+    if (children) {
+      const WaitingFor waiting("the animation thread to draw the last progress step");
+      const DWORD start = GetTickCount();
+      while (!lastStepBegun && GetTickCount() - start < 10000) Sleep(1);
+      EXPECT_TRUE(lastStepBegun) << "the last progress step was never drawn";
+    }
     return fillResult;
   }
 };
@@ -71,6 +93,7 @@ class Tree : public CHourglassFX<CProgressFX<RecordingTree>> {
       frames.push_back(FrameIndex());
     else
       fillWidths.push_back(FillRect().right - FillRect().left);
+    ++ticksEnded;
   }
 };
 
@@ -122,17 +145,25 @@ class WaitingTree : public ::testing::Test {
 TEST_F(WaitingTree, LoadsBehindThePlaceholderAndJoinsTheAnimationBeforeShowing) {
   m_tree.children = 12;
   HTREEITEM folder = Folder("folder");
-  m_tree.Expand(folder, TVE_EXPAND);
+  {
+    const WaitingFor waiting("the folder's load, which ends with the join of the animation thread");
+    m_tree.Expand(folder, TVE_EXPAND);
+  }
 
   EXPECT_EQ(m_tree.fills, 1);
   EXPECT_EQ(m_tree.placeholders, 1);
   EXPECT_TRUE(m_tree.placeholderGoneDuringFill);
+  ASSERT_NE(m_tree.animationThread, nullptr) << "the animation thread never ticked";
   EXPECT_TRUE(m_tree.threadEndedAtShow);
   EXPECT_TRUE(m_tree.handlesClosedAtShow);
+  WaitForSingleObject(m_tree.animationThread, 5000);  // a tick still running is counted once it ends
+  EXPECT_EQ(m_tree.ticksEnded, m_tree.ticksEndedAtShow) << "a tick ran after the tree was shown";
   ASSERT_GE(m_tree.frames.size(), 3u) << "12 children at 60 ms take several ticks";
   for (size_t i = 0; i < m_tree.frames.size(); ++i) EXPECT_EQ(m_tree.frames[i], static_cast<int>((i + 1) % 10));
-  ASSERT_FALSE(m_tree.fillWidths.empty());
-  for (int width : m_tree.fillWidths) EXPECT_TRUE(width >= 0 && width <= 50) << width;
+  ASSERT_GE(m_tree.fillWidths.size(), 2u);
+  EXPECT_TRUE(std::is_sorted(m_tree.fillWidths.begin(), m_tree.fillWidths.end())) << ::testing::PrintToString(m_tree.fillWidths);
+  EXPECT_LT(m_tree.fillWidths.front(), m_tree.fillWidths.back());
+  EXPECT_EQ(m_tree.fillWidths.back(), 56 - 2 * 3) << "the bar is full when the last child is in";
 
   const RECT &text = m_tree.placeholderText, &bar = m_tree.BarRect(), &icon = m_tree.IconRect();
   const int textHeight = text.bottom - text.top, barHeight = textHeight - 2 * std::max(0, (textHeight - 16) / 2);
