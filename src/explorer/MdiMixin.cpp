@@ -17,6 +17,9 @@ bool CMdiMixin::SetFrameResource(UINT resourceId) {
 
 bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
   new COmbra3Doc;
+  // The drawing of the last browse is not chosen in this one until the search finds it again.
+  const std::string remembered = g_pDoc->m_strName;
+  g_pDoc->m_strName.clear();
   auto *frame = new CMainFrame;
   HWND hostFrame = static_cast<HWND>(acedGetAcadFrame());
   if (hostFrame) ::EnableWindow(hostFrame, FALSE);
@@ -53,8 +56,8 @@ bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
   }
   frame->UpdateWindow();
   frame->EnableAccept(false);
-  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(SplitPath(g_pDoc->m_strName).baseName);
-  g_pDoc->m_strName.clear();
+  // What the search finds is chosen: marked, named in the title, and what accept returns.
+  if (!remembered.empty()) frame->SetSearchText(SplitPath(remembered).baseName);
   return true;
 }
 

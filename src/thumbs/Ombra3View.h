@@ -27,7 +27,9 @@ class COmbra3View : public fw::CScrollView {
   void SelectAll();
   void CopySelected();
   void DeleteSelected();
+  // The clipboard's files into the shown folder; false, and nothing pasted, without one.
   bool PasteFiles();
+  bool CanPasteHere() const;
   // Scans the folder again once the current message is done (after a rename in a caption box,
   // whose window and object the rescan destroys).
   void PostRefreshFolder() const;
