@@ -31,6 +31,17 @@ class FindListing {
   intptr_t m_handle;
 };
 
+// The entry's name in the ANSI code page, false when it has no exact form there. ASCII, the
+// usual name, reads the same in every ANSI code page: only other names take the conversion.
+bool AnsiName(const wchar_t *wide, std::string &name) {
+  name.clear();
+  for (const wchar_t *c = wide; *c; ++c) {
+    if (*c >= 0x80) return ToAnsiExact(wide, name);
+    name.push_back(static_cast<char>(*c));
+  }
+  return true;
+}
+
 // The scan's filter for a name that has no ANSI form, on its wide text: is it one of the
 // entries the scan would take?
 bool WouldTake(std::wstring name, bool isFolder, const char *extension) {
@@ -68,7 +79,7 @@ bool ScanFolder(const std::string &path, const char *extension) {
   std::string name;
   do {
     const bool isFolder = (entry.attrib & _A_SUBDIR) != 0;
-    if (!ToAnsiExact(entry.name, name)) {
+    if (!AnsiName(entry.name, name)) {
       if (WouldTake(entry.name, isFolder, extension)) ++leftOut;
     } else if (TakeListingEntry(name.data(), isFolder, extension)) {
       records.Add(name.c_str(), entry.time_write, static_cast<uint32_t>(entry.size));

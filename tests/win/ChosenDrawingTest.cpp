@@ -134,7 +134,9 @@ class MenuAnswerer {
 // Clicks the Insert button as the mouse does; a disabled one does nothing, and the browse is
 // then closed.
 void PressInsertThenClose(HWND frame) {
-  HWND bar = ToolBars(frame)[1];
+  const std::vector<HWND> bars = ToolBars(frame);
+  if (bars.size() != 2) return;  // the browse has ended already
+  HWND bar = bars[1];
   RECT button{};
   SendMessageA(bar, TB_GETRECT, kAccept, reinterpret_cast<LPARAM>(&button));
   const LPARAM centre = MAKELPARAM((button.left + button.right) / 2, (button.top + button.bottom) / 2);
@@ -175,12 +177,12 @@ TEST_F(ChosenDrawing, TheRememberedDrawingIsChosenWhenTheSearchFindsIt) {
   for (const char *name : {"door-1.dwg", "door-2.dwg", "door-3.dwg"}) m_folder.File(name, "");
   const struct {
     const char *remembered;
-    Choice shown;
+    Choice shown{};
     std::wstring returned;
   } rows[] = {{"door-2.dwg", {Folder() + "\\door-2.dwg", true, {"door-2.dwg"}}, Returned("door-2.dwg")},
               {"gone.dwg", {Folder(), false, {}}, L"nil"}};
   for (const auto &row : rows) {
-    Choice shown;
+    Choice shown{};
     const std::wstring returned = Run(row.remembered, [&](HWND frame, HWND) { shown = Shown(frame); });
     EXPECT_EQ(shown, row.shown) << row.remembered;
     EXPECT_EQ(returned, row.returned) << row.remembered;
@@ -192,14 +194,14 @@ TEST_F(ChosenDrawing, ClickOrSearchThenInsertReturnsTheDrawingMarkedAndNamedInTh
   for (const char *name : {"a.dwg", "plan.dwg", "plan2.dwg"}) m_folder.File(name, "");
   const struct {
     const char *clicked, *typed;
-    Choice shown;
+    Choice shown{};
     std::wstring returned;
   } rows[] = {{"plan.dwg", "", {Folder() + "\\plan.dwg", true, {"plan.dwg"}}, Returned("plan.dwg")},
               {"", "plan.dwg", {Folder() + "\\plan.dwg", true, {"plan.dwg"}}, Returned("plan.dwg")},
               {"", "PLAN2", {Folder() + "\\plan2.dwg", true, {"plan2.dwg"}}, Returned("plan2.dwg")},
               {"a.dwg", "plx", {Folder(), false, {}}, L"nil"}};
   for (const auto &row : rows) {
-    Choice shown;
+    Choice shown{};
     const std::wstring returned = Run(
         "",
         [&](HWND frame, HWND box) {
@@ -225,7 +227,7 @@ TEST_F(ChosenDrawing, AfterDeleteRenameOrPasteNothingIsChosenUntilTheUserChooses
   } rows[] = {{"delete", {"a.dwg"}}, {"rename", {"a.dwg", "plan3.dwg"}}, {"paste", {"a.dwg", "new.dwg", "plan.dwg"}}};
   for (const auto &row : rows) {
     for (const char *name : {"a.dwg", "plan.dwg"}) m_folder.File(name, "");
-    Choice shown;
+    Choice shown{};
     const std::wstring returned = Run("", [&](HWND frame, HWND box) {
       const Tile plan = TileNamed(ViewOf(frame), "plan.dwg");
       Click(box, plan.hwnd, WM_LBUTTONDOWN, MK_LBUTTON);
@@ -258,7 +260,7 @@ TEST_F(ChosenDrawing, WhereNoFolderIsShownPasteIsDisabledAndPastesNothing) {
   m_folder.File("a.dwg", "");
   const ScratchFolder elsewhere("chosen-nofolder");
   PutFileOnClipboard(elsewhere.File("new.dwg", ""));
-  Choice shown;
+  Choice shown{};
   UINT pasteState = 0;
   const std::wstring returned = Run("a.dwg", [&](HWND frame, HWND box) {
     HWND tree = FindTree(frame);
