@@ -269,10 +269,7 @@ BOOL CMainFrame::OnFrameCommand(UINT id, int code, fw::CCmdUI *cmdUI) {
     case ID_CLEAR_FOCUSED_EDIT:
       if (g_pFocusedEdit) g_pFocusedEdit->SendMessage(WM_CLEAR);
       return TRUE;
-    case ID_BROWSE_ACCEPT:
-      // Only a chosen drawing is returned: never the folder alone.
-      if (g_pDoc && !g_pDoc->m_strName.empty()) EndBrowse(1);
-      return TRUE;
+    case ID_BROWSE_ACCEPT: EndBrowse(1); return TRUE;
     case ID_BROWSE_CANCEL: EndBrowse(2); return TRUE;
     case ID_APP_ABOUT: {
       CAboutDlgArx about(this);

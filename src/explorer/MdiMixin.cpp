@@ -25,6 +25,7 @@ bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
   if (hostFrame) ::EnableWindow(hostFrame, FALSE);
   if (!frame->LoadFrame(m_nFrameResource, WS_OVERLAPPEDWINDOW | fw::FWS_ADDTOTITLE, dialog)) {
     if (hostFrame) ::EnableWindow(hostFrame, TRUE);
+    g_pDoc->m_strName = remembered;  // no browse took place: the next one looks for it again
     return false;
   }
   m_pMainWnd = dialog;
