@@ -25,6 +25,12 @@ class COmbra3Doc : public fw::CDocument {
   int m_nPictureHeight = 0;
   int m_nSort = 0;
   CIniFile m_iniFile;
+  // Not kept between calls: the last scan listed a file-system folder, m_strPath; an item
+  // without one (My Computer) shows none, and nothing may be pasted into it.
+  bool m_bFolderShown = false;
+  // Drawings of the shown folder whose names the ANSI code page cannot hold: left out of the
+  // catalogue, as no narrow path would name them.
+  int m_nDrawingsLeftOut = 0;
 
  private:
   void LoadState();

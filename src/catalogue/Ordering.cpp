@@ -111,7 +111,7 @@ int FindPrefixMatch(const DwgCatalogue &catalogue, const std::string &text) {
   const int count = catalogue.GetSize();
   for (int index = 0; index < count; ++index) {
     const std::string &name = catalogue[index].m_strDwgName;
-    if (name.size() > text.size() && CompareNoCase(name.substr(0, text.size()).c_str(), text.c_str()) == 0) return index;
+    if (name.size() >= text.size() && CompareNoCase(name.substr(0, text.size()).c_str(), text.c_str()) == 0) return index;
   }
   return -1;
 }

@@ -16,7 +16,7 @@ bool CompareBySize(const DwgData &a, const DwgData &b);  // smallest first
 // Any key other than name, date or size leaves the listing order. Records keep their marks.
 void SortRecords(DwgCatalogue &catalogue, int sortKey);
 
-// Index of the first record, in catalogue order, whose name is longer than `text` and begins
-// with it without regard to case; "*" and "?" are ordinary characters. -1 when the text is
-// empty or no record matches.
+// Index of the first record, in catalogue order, whose name begins with `text` (or is it)
+// without regard to case; "*" and "?" are ordinary characters. -1 when the text is empty or no
+// record matches.
 int FindPrefixMatch(const DwgCatalogue &catalogue, const std::string &text);

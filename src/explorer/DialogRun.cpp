@@ -33,7 +33,9 @@ BOOL CDialogRun::OnInitDialog() {
 }
 
 BOOL CDialogRun::PreTranslateMessage(MSG *msg) {
-  if (msg->message == WM_APP) EndDialog(static_cast<int>(msg->wParam));
+  // The explorer's end request is posted to this dialog; WM_APP reaching the loop for another
+  // window, or for the thread, is someone else's message.
+  if (msg->message == WM_APP && m_hWnd && msg->hwnd == m_hWnd) EndDialog(static_cast<int>(msg->wParam));
   return CDialog::PreTranslateMessage(msg);
 }
 

@@ -1,5 +1,5 @@
 // The hidden modal dialog of a browse call: it creates the explorer and ends its modal run when
-// the explorer posts WM_APP (first parameter 1 accept, 2 cancel).
+// the explorer posts WM_APP to it (first parameter 1 accept, 2 cancel).
 #pragma once
 
 #include "fw/Dialog.h"

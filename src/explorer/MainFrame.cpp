@@ -4,6 +4,7 @@
 #include "explorer/AboutDlgArx.h"
 #include "explorer/FocusRing.h"
 #include "explorer/LeftView.h"
+#include "filecmd/MarkedPaths.h"
 #include "fw/CmdUI.h"
 #include "fw/WinApp.h"
 #include "host/ModuleGlobals.h"
@@ -142,8 +143,14 @@ BOOL CMainFrame::OnCreateClient(CREATESTRUCTA *) {
 
 void CMainFrame::OnDestroy() {
   if (g_pDoc && m_bComplete) {
+    // A minimised frame is remembered at the size it is restored to, not as its icon.
     RECT window;
-    GetWindowRect(&window);
+    WINDOWPLACEMENT placement{};
+    placement.length = sizeof placement;
+    if (IsIconic(m_hWnd) && GetWindowPlacement(m_hWnd, &placement))
+      window = placement.rcNormalPosition;
+    else
+      GetWindowRect(&window);
     g_pDoc->m_nWindowWidth = window.right - window.left;
     g_pDoc->m_nWindowHeight = window.bottom - window.top;
     if (m_wndSplitter.m_hWnd) {
@@ -175,7 +182,7 @@ void CMainFrame::EnableAccept(bool enable) {
 
 void CMainFrame::UpdateLayerLabel() {
   std::string layer;
-  if (g_pDoc) {
+  if (g_pDoc && g_pDoc->m_bFolderShown) {
     CIniFile settings;
     settings.SetFilePath(g_pDoc->m_strPath + "\\datains.ini");
     if (settings.Load()) layer = settings.GetString("Default Parameters", "Layer");
@@ -186,6 +193,37 @@ void CMainFrame::UpdateLayerLabel() {
 
 void CMainFrame::SetSearchText(const std::string &text) {
   if (m_wndSearch.m_hWnd) m_wndSearch.SetWindowText(text);
+}
+
+void CMainFrame::ShowScannedFolder() {
+  // What was chosen before the scan may be gone or renamed: the user chooses again.
+  ShowNothingChosen();
+  UpdateLayerLabel();
+  const int leftOut = g_pDoc ? g_pDoc->m_nDrawingsLeftOut : 0;
+  m_strFolderNote.clear();
+  if (leftOut == 1)
+    m_strFolderNote = "1 drawing is not shown: its name has characters that this system's code page cannot hold";
+  else if (leftOut > 1)
+    m_strFolderNote = std::to_string(leftOut) +
+                      " drawings are not shown: their names have characters that this system's code page cannot hold";
+  if (m_strFolderNote.empty())
+    SetMessageText(AFX_IDS_IDLEMESSAGE);
+  else
+    SetMessageText(m_strFolderNote);
+}
+
+void CMainFrame::ShowChosen(const std::string &name) {
+  if (!g_pDoc) return;
+  g_pDoc->m_strName = name;
+  SetWindowText(FolderWithSeparator(g_pDoc->m_strPath) + name);
+}
+
+void CMainFrame::ShowNothingChosen() {
+  if (g_pDoc) {
+    g_pDoc->m_strName.clear();
+    SetWindowText(g_pDoc->m_bFolderShown ? g_pDoc->m_strPath : g_pDoc->m_strShellPath);
+  }
+  EnableAccept(false);
 }
 
 void CMainFrame::OpenHelp() const {
@@ -247,4 +285,14 @@ BOOL CMainFrame::OnFrameCommand(UINT id, int code, fw::CCmdUI *cmdUI) {
     case ID_HELP: OpenHelp(); return TRUE;
     default: return CFrameWnd::OnFrameCommand(id, code, cmdUI);
   }
+}
+
+LRESULT CMainFrame::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+  const LRESULT result = CFrameWnd::WindowProc(message, wParam, lParam);
+  // Menus and tool tips put the idle message back when they are done: the folder's note stands
+  // in its place.
+  const bool idleAgain = message == WM_EXITMENULOOP || (message == WM_MENUSELECT && HIWORD(wParam) == 0xFFFF) ||
+                         (message == fw::WM_SETMESSAGESTRING && wParam == AFX_IDS_IDLEMESSAGE);
+  if (idleAgain && !m_strFolderNote.empty() && m_wndStatusBar.m_hWnd) SetMessageText(m_strFolderNote);
+  return result;
 }

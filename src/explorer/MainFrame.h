@@ -20,6 +20,15 @@ class CMainFrame : public fw::CFrameWnd {
   // " Layer name: " and the shown folder's layer from its "datains.ini", or "Current".
   void UpdateLayerLabel();
   void SetSearchText(const std::string &text);
+  // A freshly scanned folder: nothing chosen, its layer, and how many of its drawings were left
+  // out of the catalogue, which the status bar says while the folder is shown.
+  void ShowScannedFolder();
+  // The drawing chosen in the view or found by the search: its name in the document, its path
+  // in the title. Accept follows the caller's action.
+  void ShowChosen(const std::string &name);
+  // No drawing chosen: the document's name empty, the shown folder in the title (the tree's path
+  // of an item without one), accept disabled.
+  void ShowNothingChosen();
 
   fw::CSplitterWnd m_wndSplitter;
   int m_nSortKey;
@@ -38,6 +47,7 @@ class CMainFrame : public fw::CFrameWnd {
   void OnDestroy() override;
   BOOL OnFrameCommand(UINT id, int code, fw::CCmdUI *cmdUI) override;
   BOOL PreTranslateMessage(MSG *msg) override;
+  LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
  private:
   bool CreateTopBar();
@@ -52,6 +62,8 @@ class CMainFrame : public fw::CFrameWnd {
 
   // Set once every window of the frame exists: a half-made frame leaves the document alone.
   bool m_bComplete = false;
+  // What the status bar says in place of its idle message while the shown folder needs it.
+  std::string m_strFolderNote;
 };
 
 // The explorer frame while the explorer is open, or null.

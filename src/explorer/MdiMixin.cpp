@@ -17,11 +17,15 @@ bool CMdiMixin::SetFrameResource(UINT resourceId) {
 
 bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
   new COmbra3Doc;
+  // The drawing of the last browse is not chosen in this one until the search finds it again.
+  const std::string remembered = g_pDoc->m_strName;
+  g_pDoc->m_strName.clear();
   auto *frame = new CMainFrame;
   HWND hostFrame = static_cast<HWND>(acedGetAcadFrame());
   if (hostFrame) ::EnableWindow(hostFrame, FALSE);
   if (!frame->LoadFrame(m_nFrameResource, WS_OVERLAPPEDWINDOW | fw::FWS_ADDTOTITLE, dialog)) {
     if (hostFrame) ::EnableWindow(hostFrame, TRUE);
+    g_pDoc->m_strName = remembered;  // no browse took place: the next one looks for it again
     return false;
   }
   m_pMainWnd = dialog;
@@ -53,8 +57,8 @@ bool CMdiMixin::CreateExplorerFrame(fw::CDialog *dialog) {
 
   frame->UpdateWindow();
   frame->EnableAccept(false);
-  if (!g_pDoc->m_strName.empty()) frame->SetSearchText(SplitAnsiPath(g_pDoc->m_strName).baseName);
-  g_pDoc->m_strName.clear();
+  // What the search finds is chosen: marked, named in the title, and what accept returns.
+  if (!remembered.empty()) frame->SetSearchText(SplitAnsiPath(remembered).baseName);
   return true;
 }
 

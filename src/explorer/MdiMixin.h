@@ -14,7 +14,8 @@ class CMdiMixin : public fw::CWinApp {
  public:
   virtual bool SetFrameResource(UINT resourceId);
   // Creates the document and the frame owned by the dialog, disables the host's main window
-  // and shows the frame where it was last; false when the frame could not be made.
+  // and shows the frame where it was last, with the drawing of the last browse chosen when the
+  // search finds it; false when the frame could not be made.
   virtual bool CreateExplorerFrame(fw::CDialog *dialog);
 
   std::string GetFolderPath() const;

@@ -76,7 +76,7 @@ bool ForFileCommands::CanPaste() {
   return found;
 }
 
-bool ForFileCommands::Paste() {
+bool ForFileCommands::Paste(const std::string &folder) {
   std::vector<std::string> sources;
   std::vector<std::wstring> unpastable;
   const bool read = ForEachClipboardPath([&](const ClipboardPath &path) {
@@ -90,12 +90,10 @@ bool ForFileCommands::Paste() {
     ReportUnpastable(unpastable);
     return false;
   }
-  char destination[MAX_PATH];
-  const DWORD length = GetCurrentDirectoryA(MAX_PATH, destination);
-  if (!read || length == 0 || length >= MAX_PATH) return false;
+  if (!read || folder.empty()) return false;
   CShellFileOp operation;
   for (const std::string &source : sources) operation.AddFile(0, source.c_str());
-  operation.AddFile(1, destination);
+  operation.AddFile(1, folder.c_str());
   return operation.CopyFiles() == 0;
 }
 

@@ -1,4 +1,4 @@
-// Reading the clipboard's file list, paste into the shown folder, and rename: stateless, made
+// Reading the clipboard's file list, paste into a folder, and rename: stateless, made
 // on the stack around each use.
 #pragma once
 
@@ -12,10 +12,10 @@ class ForFileCommands {
 
   // True when the clipboard offers a file list holding at least one drawing.
   bool CanPaste();
-  // Copies every file of the clipboard's list into the current directory through the shell;
-  // true when the shell reports success. A list holding a name with no exact ANSI form is
-  // refused whole, and the user is told which files could not be pasted.
-  bool Paste();
+  // Copies every file of the clipboard's list into the folder through the shell; true when the
+  // shell reports success. A list holding a name with no exact ANSI form is refused whole, and
+  // the user is told which files could not be pasted.
+  bool Paste(const std::string &folder);
   // Renames through the shell and returns its result, 0 for success. The owner is not used.
   int RenameFile(const char *from, const char *to, HWND owner);
   // Renames the drawing oldName of folder to newName, which must be a plain file name that

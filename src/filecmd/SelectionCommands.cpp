@@ -22,4 +22,4 @@ int DeleteSelected(const DwgCatalogue &catalogue, const std::string &folder) {
   return operation.DeleteFiles();
 }
 
-bool PasteFiles() { return ForFileCommands().Paste(); }
+bool PasteFiles(const std::string &folder) { return ForFileCommands().Paste(folder); }

@@ -13,4 +13,4 @@ bool CopySelected(const DwgCatalogue &catalogue, const std::string &folder);
 // shell's result, which callers need not look at: they scan the folder again in any case.
 // With nothing marked the shell is not called at all (non-zero result, nothing touched).
 int DeleteSelected(const DwgCatalogue &catalogue, const std::string &folder);
-bool PasteFiles();
+bool PasteFiles(const std::string &folder);

@@ -10,6 +10,7 @@
 #include <shlobj.h>
 #include <shlwapi.h>
 
+#include <algorithm>
 #include <cstring>
 #include <memory>
 
@@ -67,8 +68,11 @@ void MakeStartShellPath(const char *folder, char *out, size_t capacity) {
   names.drives = SpecialFolderName(owner, desktop.get(), CSIDL_DRIVES);
   names.network = SpecialFolderName(owner, desktop.get(), CSIDL_NETWORK);
 
-  const PathParts parts = SplitAnsiPath(folder ? folder : "");
+  // LISP programs write paths with "/": the tree's labels are joined by "\".
+  std::string path = folder ? folder : "";
+  std::replace(path.begin(), path.end(), '/', '\\');
+  const PathParts parts = SplitAnsiPath(path);
   const std::string driveName = parts.drive.empty() ? std::string() : DriveRootDisplayName(parts.drive);
-  const std::string path = ComposeStartShellPath(names, driveName, parts.directory);
-  if (path.size() < capacity) path.copy(out, path.size()), out[path.size()] = '\0';
+  const std::string shellPath = ComposeStartShellPath(names, driveName, parts.directory);
+  if (shellPath.size() < capacity) shellPath.copy(out, shellPath.size()), out[shellPath.size()] = '\0';
 }

@@ -6,7 +6,6 @@
 #include "explorer/LeftView.h"
 #include "explorer/MainFrame.h"
 #include "filecmd/ForFileCommands.h"
-#include "filecmd/MarkedPaths.h"
 #include "fw/Menu.h"
 #include "fw/WinApp.h"
 #include "host/HostApi.h"
@@ -81,8 +80,11 @@ void exCDwgThumbnail::ShowMark() {
 DwgData &exCDwgThumbnail::Record() const { return (*g_pCatalogue)[m_nIndex]; }
 
 void exCDwgThumbnail::ShowChosen(bool chosen) const {
-  if (g_pDoc) g_pDoc->m_strName = chosen ? Record().m_strDwgName : std::string();
-  if (g_pMainFrame) g_pMainFrame->SetWindowText(chosen ? PathInCurrentDirectory(m_strFileName) : CurrentDirectory());
+  if (!g_pMainFrame) return;
+  if (chosen)
+    g_pMainFrame->ShowChosen(Record().m_strDwgName);
+  else
+    g_pMainFrame->ShowNothingChosen();
 }
 
 void exCDwgThumbnail::Click() {
@@ -110,10 +112,8 @@ void exCDwgThumbnail::ControlClick() {
 }
 
 void exCDwgThumbnail::Accept() const {
-  if (g_pDoc) {
-    g_pDoc->m_strName = Record().m_strDwgName;
-    g_pDoc->m_strPath = FolderWithSeparator(CurrentDirectory());
-  }
+  // The shown folder, as the title names the drawing: the browse call joins it to the name.
+  if (g_pDoc) g_pDoc->m_strName = Record().m_strDwgName;
   if (fw::CWinApp *app = fw::AfxGetApp(); app && app->m_pMainWnd) app->m_pMainWnd->PostMessage(WM_APP, 1, 0);
 }
 

@@ -1,12 +1,10 @@
 #include "thumbs/EditSearch.h"
 
 #include "catalogue/DwgData.h"
-#include "catalogue/Ombra3Doc.h"
 #include "catalogue/Ordering.h"
 #include "explorer/MainFrame.h"
 #include "fw/WinApp.h"
 #include "res/resource.h"
-#include "thumbs/CurrentFolder.h"
 #include "thumbs/EditEx.h"
 #include "thumbs/Ombra3View.h"
 
@@ -23,18 +21,17 @@ void CEditSearch::FindByPrefix() {
   if (text.empty() || g_pCatalogue->IsEmpty()) return;
   if (g_pThumbView) g_pThumbView->UnselectAll();
   const int found = FindPrefixMatch(*g_pCatalogue, text);
-  int chosen = 0;
-  if (found >= 0) {
-    (*g_pCatalogue)[found].Select();
-    if (g_pThumbView) g_pThumbView->ScrollToRecord(found);
-    SetFocus();  // building the tiles gave the focus to the view; typing goes on here
-    chosen = found;
+  // Without a match nothing is chosen: accept must not return a drawing nobody saw marked.
+  if (found < 0) {
+    if (g_pMainFrame) g_pMainFrame->ShowNothingChosen();
+    return;
   }
-  const std::string &name = (*g_pCatalogue)[chosen].m_strDwgName;
-  if (g_pDoc) g_pDoc->m_strName = name;
+  (*g_pCatalogue)[found].Select();
+  if (g_pThumbView) g_pThumbView->ScrollToRecord(found);
+  SetFocus();  // building the tiles gave the focus to the view; typing goes on here
   if (g_pMainFrame) {
-    g_pMainFrame->SetWindowText(PathInCurrentDirectory(name));
-    g_pMainFrame->m_wndToolBarBottom.SendMessage(TB_ENABLEBUTTON, ID_BROWSE_ACCEPT, MAKELONG(TRUE, 0));
+    g_pMainFrame->ShowChosen((*g_pCatalogue)[found].m_strDwgName);
+    g_pMainFrame->EnableAccept(true);
   }
 }
 

@@ -201,10 +201,7 @@ void COmbra3View::ResetAndBuild(BOOL sort) {
 }
 
 void COmbra3View::ReloadFolder() {
-  if (g_pMainFrame && g_pDoc) {
-    g_pMainFrame->SetWindowText(g_pDoc->m_strPath);
-    g_pMainFrame->UpdateLayerLabel();
-  }
+  if (g_pMainFrame) g_pMainFrame->ShowScannedFolder();
   ResetAndBuild(TRUE);
 }
 
@@ -273,7 +270,9 @@ void COmbra3View::DeleteSelected() {
   if (g_pDoc) ::DeleteSelected(*g_pCatalogue, g_pDoc->m_strPath);
 }
 
-bool COmbra3View::PasteFiles() { return ::PasteFiles(); }
+bool COmbra3View::CanPasteHere() const { return g_pDoc && g_pDoc->m_bFolderShown && ForFileCommands().CanPaste(); }
+
+bool COmbra3View::PasteFiles() { return g_pDoc && g_pDoc->m_bFolderShown && ::PasteFiles(g_pDoc->m_strPath); }
 
 void COmbra3View::PostRename(CaptionRename rename) {
   m_pendingRename = std::move(rename);
@@ -494,7 +493,7 @@ void COmbra3View::OnBackgroundMenu(LPARAM point) {
   if (menu.CreatePopupMenu()) {
     menu.AppendMenu(MF_STRING | marked, kMenuCopy, "&Copy");
     menu.AppendMenu(MF_STRING | marked, kMenuDelete, "&Delete");
-    menu.AppendMenu(MF_STRING | (ForFileCommands().CanPaste() ? MF_ENABLED : MF_GRAYED), kMenuPaste, "&Paste");
+    menu.AppendMenu(MF_STRING | (CanPasteHere() ? MF_ENABLED : MF_GRAYED), kMenuPaste, "&Paste");
     menu.AppendMenu(MF_STRING | MF_GRAYED, kMenuRename, "&Rename");
     POINT screen{GET_X_LPARAM(point), GET_Y_LPARAM(point)};
     ::ClientToScreen(m_hWnd, &screen);

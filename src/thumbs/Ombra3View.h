@@ -37,12 +37,14 @@ class COmbra3View : public fw::CScrollView {
   void SelectAll();
   void CopySelected();
   void DeleteSelected();
+  // The clipboard's files into the shown folder; false, and nothing pasted, without one.
   bool PasteFiles();
   // The marks of the records shown again on every caption of the ring.
   void ShowMarks();
   // Renames once the current message is done: the rename may refuse the name with a message,
   // or succeed and scan the folder again, and both may destroy the caption box that asked.
   void PostRename(CaptionRename rename);
+  bool CanPasteHere() const;
   HWND ToolTipWindow() const { return m_toolTip.m_hWnd; }
   // The record the keyboard is on, whose tile shows a focus frame; -1 before any. A click puts
   // it on the tile clicked.

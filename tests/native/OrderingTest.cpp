@@ -83,11 +83,11 @@ TEST(Ordering, ManyEqualKeysInOrderAndEveryRecordArrivesWhole) {
   }
 }
 
-TEST(PrefixMatch, FirstLongerNameInTheCurrentOrderThatBeginsWithTheText) {
+TEST(PrefixMatch, FirstNameInTheCurrentOrderThatBeginsWithTheTextOrIsIt) {
   DwgCatalogue catalogue =
       Catalogue({DwgData("plan.dwg", 2, 0), DwgData("plan2.dwg", 0, 0), DwgData("plan-a.dwg", 1, 0), DwgData("*star.dwg", 0, 0)});
-  const std::pair<const char *, int> rows[] = {{"PLAN", 0},  {"plan2", 1},        {"Plan-", 2},      {"p", 0},
-                                               {"*", 3},     {"plan.dwg", -1},    {"PLAN2.DWG", -1}, {"", -1},
+  const std::pair<const char *, int> rows[] = {{"PLAN", 0},  {"plan2", 1},        {"Plan-", 2},     {"p", 0},
+                                               {"*", 3},     {"plan.dwg", 0},     {"PLAN2.DWG", 1}, {"", -1},
                                                {"pl?n", -1}, {"plan.dwg.old", -1}};
   for (const auto &[text, index] : rows) EXPECT_EQ(FindPrefixMatch(catalogue, text), index) << '"' << text << '"';
   EXPECT_EQ(FindPrefixMatch(DwgCatalogue(), "plan"), -1);

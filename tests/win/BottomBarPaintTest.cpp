@@ -1,6 +1,8 @@
-// The bottom bar shows its captions whatever the frame's size went through: squeezed out of the
-// frame by its size grip and given room again, it is painted anew, read back from the screen.
+// The bottom bar looks the way it acts, read back from the screen: its captions show whatever
+// the frame's size went through (squeezed out of the frame by its size grip and given room
+// again), and the accept caption is drawn enabled when the button is.
 #include "ExplorerHarness.h"
+#include "ScratchFolder.h"
 #include "ScreenPixels.h"
 #include "res/resource.h"
 
@@ -65,6 +67,23 @@ TEST_F(BottomBar, ShowsItsCaptionsAgainAfterTheFrameWasSqueezedAndEnlarged) {
     DragGrip(frame, -800, -560);
     DragGrip(frame, 800, 560);
     EXPECT_GE(SettledInk(frame, bottom, shown), shown) << "the bar is blank after the frame grew again";
+    PostMessageA(frame, WM_COMMAND, ID_BROWSE_CANCEL, 0);
+  });
+}
+
+TEST_F(BottomBar, TheAcceptCaptionIsDrawnEnabledWhenTheRememberedDrawingIsFoundAtTheStart) {
+  const ScratchFolder folder("bottombar");
+  folder.File("a.dwg", "");
+  m_state.Write("[CurrentPath]\r\nPath=\r\nName=a.dwg\r\nShellPath=\r\n\r\n[Size]\r\nSplitterSize=200\r\n"
+                "WindowWidth=900\r\nWindowHeight=600\r\n");
+  const std::string start = folder.Path() + "\\";
+  Browse(BrowseArgs(std::wstring(start.begin(), start.end()).c_str()), [](HWND frame) {
+    HWND bottom = ToolBars(frame).at(1);
+    ASSERT_TRUE(SendMessageA(bottom, TB_ISBUTTONENABLED, ID_BROWSE_ACCEPT, 0)) << "the remembered drawing was not found";
+    HWND caption = FindWindowExA(bottom, nullptr, "Static", nullptr);  // the accept caption comes first
+    ASSERT_TRUE(caption);
+    EXPECT_TRUE(IsWindowEnabled(caption));
+    EXPECT_GT(SettledInk(frame, caption, 20), 20) << "the caption reads as disabled";
     PostMessageA(frame, WM_COMMAND, ID_BROWSE_CANCEL, 0);
   });
 }

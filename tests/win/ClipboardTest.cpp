@@ -27,16 +27,6 @@ class OleEnvironment : public ::testing::Environment {
 };
 const auto *const oleEnvironment = ::testing::AddGlobalTestEnvironment(new OleEnvironment);
 
-// Paste goes to the current directory, as after a folder scan.
-class CurrentDirectory {
- public:
-  explicit CurrentDirectory(const std::string &folder) : m_previous(fs::current_path()) { fs::current_path(folder); }
-  ~CurrentDirectory() { fs::current_path(m_previous); }
-
- private:
-  fs::path m_previous;
-};
-
 // Runs the reader program beside this one and returns what it printed.
 std::string ReadClipboardInAnotherProcess() {
   SECURITY_ATTRIBUTES inherit{sizeof inherit, nullptr, TRUE};
@@ -145,9 +135,8 @@ TEST(ClipboardCopy, MarkedDrawingsAreReadBackByAnotherProcessAndPasteIntoAnother
   catalogue[2].Select();
   ASSERT_TRUE(CopySelected(catalogue, source.Path()));
   EXPECT_EQ(ReadClipboardInAnotherProcess(), "offset=20 wide=0\n" + source.File("a.dwg") + "\n" + source.File("c.dwg") + "\n");
-  CurrentDirectory here(target.Path());
   EXPECT_TRUE(ForFileCommands().CanPaste());
-  EXPECT_TRUE(PasteFiles());
+  EXPECT_TRUE(PasteFiles(target.Path()));
   EXPECT_EQ(Content(target.File("a.dwg")), "a.dwg");
   EXPECT_EQ(Content(target.File("c.dwg")), "c.dwg");
   EXPECT_FALSE(fs::exists(target.File("b.dwg")));
@@ -158,9 +147,8 @@ TEST(ClipboardCopy, NothingMarkedLeavesAnEmptyListThatPastesNothing) {
   ScratchFolder target("paste-target");
   ASSERT_TRUE(CopySelected(Catalogue({"a.dwg"}), "C:\\Work\\"));
   EXPECT_EQ(ReadClipboardInAnotherProcess(), "offset=20 wide=0\n");
-  CurrentDirectory here(target.Path());
   EXPECT_FALSE(ForFileCommands().CanPaste());
-  EXPECT_FALSE(PasteFiles());
+  EXPECT_FALSE(PasteFiles(target.Path()));
   EXPECT_TRUE(fs::is_empty(target.Path()));
 }
 
@@ -171,10 +159,9 @@ TEST(ClipboardPaste, OfferedForADrawingInAnyCaseEveryFilePastes) {
     std::vector<std::string> listed{source.File("notes.txt", "notes")};
     if (withDrawing) listed.push_back(source.File("x.DWG", "x"));
     PutOnClipboard(CF_HDROP, NarrowList(listed));
-    CurrentDirectory here(target.Path());
     ForFileCommands commands;
     EXPECT_EQ(commands.CanPaste(), withDrawing);
-    EXPECT_TRUE(commands.Paste());
+    EXPECT_TRUE(commands.Paste(target.Path()));
     EXPECT_EQ(Content(target.File("notes.txt")), "notes");
     if (withDrawing) {
       EXPECT_EQ(Content(target.File("x.DWG")), "x");
@@ -189,10 +176,9 @@ TEST(ClipboardPaste, WideListFromTheShellIsReadAsAnsiPaths) {
   ASSERT_EQ(GetACP(), 1252u);
   const std::wstring wideFolder = fs::path(source.Path()).wstring();
   PutOnClipboard(CF_HDROP, WideList({wideFolder + L"\\pl\u00e4n.dwg", wideFolder + L"\\notes.txt"}));
-  CurrentDirectory here(target.Path());
   ForFileCommands commands;
   EXPECT_TRUE(commands.CanPaste());
-  EXPECT_TRUE(commands.Paste());
+  EXPECT_TRUE(commands.Paste(target.Path()));
   EXPECT_EQ(Content(target.File("pl\xE4n.dwg")), "plan");
   EXPECT_EQ(Content(target.File("notes.txt")), "notes");
 }
@@ -214,13 +200,12 @@ TEST(ClipboardPaste, NamesOutsideTheCodePageRefuseThePasteAndAreNamed) {
   const std::wstring folder = fs::path(source.Path()).wstring() + L"\\";
   for (const wchar_t *name : {L"a.dwg", L"plan.dwg", L"notes.txt", L"\u56f3.dwg", L"pl\u0101n.dwg"})
     std::ofstream(fs::path(folder + name)) << "x";
-  CurrentDirectory here(target.Path());
   for (const Row &row : rows) {
     std::vector<std::wstring> paths;
     for (const std::wstring &name : row.listed) paths.push_back(folder + name);
     PutOnClipboard(CF_HDROP, WideList(paths));
     DialogAnswerer ok(IDOK);
-    EXPECT_FALSE(ForFileCommands().Paste());
+    EXPECT_FALSE(ForFileCommands().Paste(target.Path()));
     EXPECT_EQ(ok.Caption(), "Paste");
     const std::wstring message = ok.Text();
     for (const std::wstring &name : row.listed) {
@@ -235,18 +220,17 @@ TEST(ClipboardPaste, NamesOutsideTheCodePageRefuseThePasteAndAreNamed) {
 TEST(ClipboardPaste, BrokenOrMissingListPastesNothing) {
   ScratchFolder source("broken-source"), target("broken-target");
   const std::string drawing = source.File("a.dwg", "a");
-  CurrentDirectory here(target.Path());
   ForFileCommands commands;
 
   std::string pastEnd = NarrowList({drawing});
   pastEnd.replace(0, 4, Header(4096, 0).substr(0, 4));
   PutOnClipboard(CF_HDROP, pastEnd);
   EXPECT_FALSE(commands.CanPaste());
-  EXPECT_FALSE(commands.Paste());
+  EXPECT_FALSE(commands.Paste(target.Path()));
 
   PutOnClipboard(CF_TEXT, drawing + '\0');
   EXPECT_FALSE(commands.CanPaste());
-  EXPECT_FALSE(commands.Paste());
+  EXPECT_FALSE(commands.Paste(target.Path()));
   EXPECT_TRUE(fs::is_empty(target.Path()));
 }
 }  // namespace

@@ -17,9 +17,10 @@ constexpr int kViewToolbar = 0xE800;
 constexpr int kViewStatusBar = 0xE801;
 constexpr int kEditPaste = 0xE125;
 
-std::string StateFile(int sort, int width, int height, const std::string &path = "", const std::string &name = "") {
+std::string StateFile(int sort, int width, int height, const std::string &path = "", const std::string &name = "",
+                      const std::string &shellPath = "") {
   std::ostringstream ini;
-  ini << "[CurrentPath]\r\nPath=" << path << "\r\nName=" << name << "\r\nShellPath=\r\n\r\n"
+  ini << "[CurrentPath]\r\nPath=" << path << "\r\nName=" << name << "\r\nShellPath=" << shellPath << "\r\n\r\n"
       << "[Size]\r\nSplitterSize=150\r\nWindowWidth=" << width << "\r\nWindowHeight=" << height << "\r\n\r\n"
       << "[View]\r\nPictureWidth=0\r\nPictureHeight=0\r\nSort=" << sort << "\r\n\r\n";
   return ini.str();
@@ -132,8 +133,13 @@ TEST_F(ExplorerFrame, SortMenuChecksTheKeyAndTheSortCommandsSetIt) {
   }
 }
 
-// Every way of ending the browse stores the frame's size, here changed from the remembered one.
+// Every way of ending the browse stores the frame's size, here changed from the remembered one;
+// a minimised frame stores the size it is restored to. The drawing of the last browse is chosen
+// again, so that accept has a drawing to return.
 TEST_F(ExplorerFrame, TheFirstEndMessageDecidesAcceptOrCancel) {
+  ScratchFolder scratch("end");
+  scratch.File("a.dwg", "");
+  const std::string start = scratch.Path() + "\\";
   const std::pair<std::function<void(HWND)>, int> rows[] = {
       {[](HWND frame) { Command(frame, kAccept), PostMessageA(frame, WM_CLOSE, 0, 0); }, RTLB},
       {[](HWND frame) { Command(frame, kCancel), Command(frame, kAccept); }, RTNIL},
@@ -143,11 +149,12 @@ TEST_F(ExplorerFrame, TheFirstEndMessageDecidesAcceptOrCancel) {
          PostMessageA(GetWindow(GetDlgItem(GetDlgItem(frame, 0xE900), 0xE900), GW_CHILD), WM_KEYDOWN, VK_ESCAPE, 0);
        },
        RTNIL},
+      {[](HWND frame) { ShowWindow(frame, SW_MINIMIZE), Command(frame, kCancel); }, RTNIL},
   };
   for (size_t i = 0; i < std::size(rows); ++i) {
-    m_state.Write(StateFile(0, 900, 600));
+    m_state.Write(StateFile(0, 900, 600, "", "a.dwg"));
     RECT frameRect{};
-    const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    const BrowseOutcome outcome = Browse(BrowseArgs(std::wstring(start.begin(), start.end()).c_str()), [&](HWND frame) {
       SetWindowPos(frame, nullptr, 0, 0, 800 + static_cast<int>(i), 500, SWP_NOMOVE | SWP_NOZORDER);
       GetWindowRect(frame, &frameRect);
       rows[i].first(frame);
@@ -160,27 +167,34 @@ TEST_F(ExplorerFrame, TheFirstEndMessageDecidesAcceptOrCancel) {
   }
 }
 
+// Accept returns the drawing the search found for the remembered name, joined to its folder with
+// one separator, and the folder's settings; the name is remembered for the next browse.
 TEST_F(ExplorerFrame, AcceptReturnsThePathWithTheFolderSettingsOrThreeEmptyTexts) {
   ScratchFolder scratch("accept");
   const std::string folder = scratch.Path();
+  scratch.File("plan.dwg", "");
   scratch.File("datains.ini", "[Default Parameters]\r\nLayer=WALLS\r\nLisp command=MYCMD\r\nColor=1\r\n\r\n");
+  const std::string root = "C:\\lumvex-accept-root.dwg";
+  std::ofstream(root.c_str()) << "";
   const struct {
-    std::string path, name, search;
+    std::string start, name;
     std::vector<std::wstring> texts;
-  } rows[] = {{folder, "plan.dwg", "plan", {std::wstring(folder.begin(), folder.end()) + L"\\", L"WALLS", L"1", L"MYCMD"}},
-              {"C:\\", "", "", {L"C:\\", L"", L"", L""}}};  // C:\ keeps its one separator
+  } rows[] = {{folder + "\\", "plan.dwg", {std::wstring(folder.begin(), folder.end()) + L"\\plan.dwg", L"WALLS", L"1", L"MYCMD"}},
+              {"C:\\", "lumvex-accept-root.dwg", {std::wstring(root.begin(), root.end()), L"", L"", L""}}};
   for (const auto &row : rows) {
-    m_state.Write(StateFile(0, 0, 0, row.path, row.name));
+    m_state.Write(StateFile(0, 0, 0, "", row.name));
     std::string searchText;
-    const BrowseOutcome outcome = Browse(BrowseArgs(L""), [&](HWND frame) {
+    const BrowseOutcome outcome = Browse(BrowseArgs(std::wstring(row.start.begin(), row.start.end()).c_str()), [&](HWND frame) {
       searchText = WindowText(Children(ToolBars(frame)[0], "EDIT")[0]);
       Command(frame, kAccept);
+      Command(frame, kCancel);  // ends the browse when accept had nothing to return
     });
     EXPECT_EQ(outcome.resultKind, RTLB);
     EXPECT_EQ(outcome.texts, row.texts);
-    EXPECT_EQ(searchText, row.search) << "the remembered name's base name goes into the search box";
-    EXPECT_EQ(IniValue(m_state.Read(), "Name"), "") << "the remembered name is emptied";
+    EXPECT_EQ(searchText, row.name.substr(0, row.name.find('.'))) << "the remembered name's base name goes into the search box";
+    EXPECT_EQ(IniValue(m_state.Read(), "Name"), row.name);
   }
+  DeleteFileA(root.c_str());
   EXPECT_EQ(IniValue(m_state.Read(), "Path"), "C:\\");
 }
 
@@ -223,7 +237,8 @@ TEST_F(ExplorerFrame, PasteRescansTheFolderAndShowsItInTheTitleAndItsLayerInTheL
     ScratchFolder target("paste-target");
     const std::string folder = target.Path();
     if (c.settings) target.File("datains.ini", c.settings);
-    m_state.Write(StateFile(0, 0, 0, folder));
+    // The folder of the last browse, as the tree names it: the browse opens there.
+    m_state.Write(StateFile(0, 0, 0, folder, "", "Desktop\\My Computer\\ (C:)" + folder.substr(2)));
     SetCurrentDirectoryA(folder.c_str());
     PutFileOnClipboard(drawing);
     std::string label, title;

@@ -17,6 +17,9 @@ TEST(StartShellPath, DrivesAndNetworkFoldersByTheirShellNamesLeftEmptyWhenTooLon
   EXPECT_EQ(StartShellPath("C:\\Proj\\plan.dwg"), "Desktop\\My Computer\\ (C:)\\Proj\\");
   EXPECT_EQ(StartShellPath("z:\\blocks\\"), "Desktop\\My Computer\\ (Z:)\\blocks\\");
   EXPECT_EQ(StartShellPath("\\\\server\\share\\dwg\\"), "Desktop\\My Network Places\\\\server\\share\\dwg\\");
+  // "/" as LISP programs write it
+  EXPECT_EQ(StartShellPath("C:/Proj/plan.dwg"), "Desktop\\My Computer\\ (C:)\\Proj\\");
+  EXPECT_EQ(StartShellPath("//server/share/dwg/"), "Desktop\\My Network Places\\\\server\\share\\dwg\\");
   EXPECT_EQ(StartShellPath("C:\\Proj\\", 32), "Desktop\\My Computer\\ (C:)\\Proj\\");
   EXPECT_EQ(StartShellPath("C:\\Proj\\", 31), "");
   EXPECT_EQ(StartShellPath("C:\\" + std::string(250, 'd') + "\\"), "");

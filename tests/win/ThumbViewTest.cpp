@@ -309,7 +309,7 @@ TEST_F(ThumbView, ClicksMarkDrawingsAndBothMenusActOnTheMarks) {
                                 {WM_LBUTTONDOWN, 2, MK_LBUTTON | MK_SHIFT, {0}, false, nullptr, {}, 0},
                                 {WM_LBUTTONDOWN, 2, MK_LBUTTON, {2}, true, "\\d002.dwg", {}, 0},
                                 {WM_RBUTTONDOWN, 3, MK_RBUTTON, {2, 3}, true, "\\d003.dwg", {VK_DOWN, VK_RETURN}, 0},
-                                {WM_RBUTTONDOWN, 4, MK_RBUTTON, {}, true, "", {'D'}, IDNO}};  // refused, rescanned
+                                {WM_RBUTTONDOWN, 4, MK_RBUTTON, {}, false, "", {'D'}, IDNO}};  // refused, rescanned
   MakeDrawings(6);
   const ScratchFolder elsewhere("thumbview-other");
   const std::string other = elsewhere.File("new.dwg", "");
@@ -366,11 +366,11 @@ TEST_F(ThumbView, SearchFindsByPrefixAndClickingTheBoxEmptiesIt) {
     const std::vector<Tile> tiles = Tiles(view);  // room for 4 columns: 3 tiles in one row
     ASSERT_EQ(tiles.size(), 3u);
     EXPECT_EQ(tiles[2].rect.left * 1000 + tiles[2].rect.top, 356 * 1000);
-    for (const auto &[text, marked] : std::vector<std::pair<const char *, std::vector<int>>>{{"pl", {1}}, {"a.dwg", {}}}) {
+    for (const auto &[text, marked] : std::vector<std::pair<const char *, std::vector<int>>>{{"pl", {1}}, {"a.dwg", {0}}}) {
       SendMessageA(ToolBars(frame)[1], TB_ENABLEBUTTON, 32795, FALSE);
       SendMessageA(SearchBox(frame), WM_SETTEXT, 0, LPARAM(text));
       EXPECT_EQ(Marked(view), marked) << text;
-      EXPECT_EQ(WindowText(frame), Folder() + (marked.empty() ? "\\a.dwg" : "\\plan.dwg")) << text;
+      EXPECT_EQ(WindowText(frame), Folder() + (marked[0] == 0 ? "\\a.dwg" : "\\plan.dwg")) << text;
       EXPECT_TRUE(AcceptEnabled(frame)) << text;
     }
     Post(frame, SearchBox(frame), WM_LBUTTONDOWN, MK_LBUTTON);
