@@ -46,9 +46,11 @@ press Tab Tab shift+Tab Tab Return
 check "Tab and Shift+Tab reach the accept button, and Enter there accepts" "$(result "${names[0]}")" "$(ended)"
 
 browse ""
-press Tab Right F2 End shift+Home
+press Tab Right F2
+# The caption box has the keyboard now: typed straight at it, as a person goes on typing.
+xdotool key --delay 250 End shift+Home
 xdotool type --delay 60 keyed
-press Return
+xdotool key Return
 renamed() { [ -e "$world/Keys/keyed.dwg" ] && [ ! -e "$world/Keys/${names[0]}" ]; }
 until_true 10 renamed
 check "F2 renames the marked drawing, and a name typed without .dwg keeps it" "keyed.dwg" "$(ls "$world/Keys" | grep -x -e keyed.dwg -e "${names[0]}")"

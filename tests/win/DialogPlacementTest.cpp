@@ -1,5 +1,5 @@
-// The host's colour dialog opens near its owner and inside the work area, wherever the owner
-// lies: a person can always reach its title bar and its buttons.
+// The host's colour dialog and its alerts open near their owner and inside the work area,
+// wherever the owner lies: a person can always reach their title bar and their buttons.
 #include "host/HostApi.h"
 
 #include <windows.h>
@@ -10,22 +10,22 @@
 
 namespace {
 
-// Reads where the colour dialog opened and cancels it, from its own thread, as a person would.
-RECT CancelledAt() {
+// Reads where the dialog opened and closes it with the button, from its own thread, as a person would.
+RECT ClosedAt(const char *className, const char *title, int button) {
   RECT at{};
   for (int waited = 0; waited < 10000; waited += 20) {
-    if (HWND dialog = FindWindowA("DevhostSelectColor", "Select Color"); dialog && IsWindowVisible(dialog)) {
+    if (HWND dialog = FindWindowA(className, title); dialog && IsWindowVisible(dialog)) {
       GetWindowRect(dialog, &at);
-      PostMessageA(dialog, WM_COMMAND, IDCANCEL, 0);
+      PostMessageA(dialog, WM_COMMAND, button, 0);
       return at;
     }
     Sleep(20);
   }
-  ADD_FAILURE() << "the colour dialog never showed";
+  ADD_FAILURE() << title << " never showed";
   return at;
 }
 
-TEST(ColorDialog, OpensInsideTheWorkAreaNearItsOwner) {
+TEST(HostDialogs, TheColourDialogAndAlertsOpenInsideTheWorkAreaNearTheirOwner) {
   RECT work{};
   SystemParametersInfoA(SPI_GETWORKAREA, 0, &work, 0);
   const int right = work.right - 200, bottom = work.bottom - 100;
@@ -42,19 +42,25 @@ TEST(ColorDialog, OpensInsideTheWorkAreaNearItsOwner) {
                                   nullptr, nullptr);
     ASSERT_TRUE(window);
     SetActiveWindow(window);
-    RECT at{};
-    std::thread watcher([&at] { at = CancelledAt(); });
+    RECT colors{}, alert{};
+    std::thread watcher([&colors] { colors = ClosedAt("DevhostSelectColor", "Select Color", IDCANCEL); });
     int color = 7;
     EXPECT_FALSE(acedSetColorDialog(color, false, 7));
     watcher.join();
+    SetActiveWindow(window);
+    std::thread answerer([&alert] { alert = ClosedAt("#32770", "AutoCAD Message", IDOK); });
+    acedAlert(L"Name of layer is empty");
+    answerer.join();
     DestroyWindow(window);
-    EXPECT_GE(at.left, work.left);
-    EXPECT_GE(at.top, work.top) << "its title bar is out of reach";
-    EXPECT_LE(at.right, work.right);
-    EXPECT_LE(at.bottom, work.bottom);
+    for (const RECT &at : {colors, alert}) {
+      EXPECT_GE(at.left, work.left);
+      EXPECT_GE(at.top, work.top) << "its title bar is out of reach";
+      EXPECT_LE(at.right, work.right);
+      EXPECT_LE(at.bottom, work.bottom);
+    }
     if (owner.centred) {
-      EXPECT_NEAR((at.left + at.right) / 2, (owner.rect.left + owner.rect.right) / 2, 1);
-      EXPECT_NEAR((at.top + at.bottom) / 2, (owner.rect.top + owner.rect.bottom) / 2, 1);
+      EXPECT_NEAR((colors.left + colors.right) / 2, (owner.rect.left + owner.rect.right) / 2, 1);
+      EXPECT_NEAR((colors.top + colors.bottom) / 2, (owner.rect.top + owner.rect.bottom) / 2, 1);
     }
   }
 }
