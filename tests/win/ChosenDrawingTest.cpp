@@ -103,7 +103,13 @@ class MenuAnswerer {
  public:
   MenuAnswerer(WPARAM key, int confirmButton)
       : m_thread([this, key, confirmButton] {
-          if (HWND menu = WaitForWindow("#32768", nullptr, 5000)) PostMessageA(menu, WM_KEYDOWN, key, 0);
+          // A key that reaches the menu before its loop has begun is lost: it is sent again while
+          // the menu still shows.
+          if (HWND menu = WaitForWindow("#32768", nullptr, 5000))
+            for (int tries = 0; tries < 5 && IsWindowVisible(menu); ++tries) {
+              PostMessageA(menu, WM_KEYDOWN, key, 0);
+              for (int waited = 0; waited < 1000 && IsWindowVisible(menu); waited += 20) Sleep(20);
+            }
           while (!m_bStop) {
             if (HWND confirm = FindWindowA("#32770", "Confirm file deletion"); confirm && IsWindowVisible(confirm)) {
               SendMessageA(GetDlgItem(confirm, confirmButton), BM_CLICK, 0, 0);
