@@ -8,18 +8,14 @@
 //                             the two one after the other, so that a busy machine weighs on both
 // Prints one figure a line: name value unit.
 #include "BenchClock.h"
-#include "ExplorerHarness.h"
+#include "ViewBenchRun.h"
 
 #include <windows.h>
-#include <ole2.h>
 
 #include <cstdio>
-#include <thread>
 #include <vector>
 
 namespace {
-const char kFolder[] = "Z:\\tmp\\lumvex-bench-view-100k\\";
-const wchar_t kFolderW[] = L"Z:\\tmp\\lumvex-bench-view-100k\\";
 constexpr int kColumns = 6;
 constexpr int kVisibleRows = 4;
 constexpr int kRounds = 41;
@@ -30,14 +26,6 @@ constexpr int kBrowseCancel = 32796;
 // "d050" the same row again, so every round does the same work.
 const char kStartText[] = "d05";
 constexpr WPARAM kTyped = '0';
-
-int CaptionHeight() {
-  HDC screen = GetDC(nullptr);
-  TEXTMETRICA metrics{};
-  GetTextMetricsA(screen, &metrics);
-  ReleaseDC(nullptr, screen);
-  return metrics.tmHeight + 2 + GetSystemMetrics(SM_CYEDGE);
-}
 
 bool AnyUnpainted(HWND view) {
   if (GetUpdateRect(view, nullptr, FALSE)) return true;
@@ -62,14 +50,6 @@ double UntilPainted(HWND view, const std::function<void()> &action) {
   while (AnyUnpainted(view)) Sleep(0);  // whatever a paint invalidated anew
   SendMessageA(view, WM_NULL, 0, 0);
   return NowMs() - start;
-}
-
-HWND FindFrame() {
-  for (int waited = 0; waited < 60000; waited += 50) {
-    if (HWND frame = FindWindowA("FwFrame128", nullptr); frame && IsWindowVisible(frame)) return frame;
-    Sleep(50);
-  }
-  return nullptr;
 }
 
 void Measure(HWND frame) {
@@ -107,22 +87,4 @@ void Measure(HWND frame) {
 }
 }  // namespace
 
-int main() {
-  if (GetFileAttributesA(kFolder) == INVALID_FILE_ATTRIBUTES) {
-    std::fprintf(stderr, "bench_search: %s is missing (target thumbview_bench_folder makes it)\n", kFolder);
-    return 1;
-  }
-  OleInitialize(nullptr);
-  {
-    StateFileGuard state;  // the browse remembers the bench folder: the state file is put back after
-    LoadedModule module;
-    std::thread watcher([] {
-      if (HWND frame = FindFrame()) Measure(frame);
-    });
-    devhostInvoke(L"Lumvex", acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, kFolderW, RTSTR, L"Insert", RTSTR, L"Close", 0));
-    watcher.join();
-    devhostClearResult();
-  }
-  OleUninitialize();
-  return 0;
-}
+int main() { return RunViewBench("bench_search", Measure); }

@@ -10,22 +10,18 @@
 //   view_gdi_growth              live GDI objects after, minus before
 // Prints one figure a line: name value unit.
 #include "BenchClock.h"
-#include "ExplorerHarness.h"
+#include "ViewBenchRun.h"
 #include "catalogue/FolderScan.h"
 #include "preview/PreviewTestApi.h"
 
 #include <windows.h>
-#include <ole2.h>
 
 #include <algorithm>
 #include <cstdio>
 #include <string>
-#include <thread>
 #include <vector>
 
 namespace {
-const char kFolder[] = "Z:\\tmp\\lumvex-bench-view-100k\\";
-const wchar_t kFolderW[] = L"Z:\\tmp\\lumvex-bench-view-100k\\";
 constexpr int kColumns = 6;
 constexpr int kVisibleRows = 4;
 constexpr int kSteps = 200;
@@ -40,7 +36,7 @@ std::string Name(int record) {
 }
 
 std::wstring FullPath(int record) {
-  const std::string path = kFolder + Name(record);
+  const std::string path = kViewBenchFolder + Name(record);
   return std::wstring(path.begin(), path.end());
 }
 
@@ -86,14 +82,6 @@ int LiveGdiObjects() {
   return count;
 }
 
-int CaptionHeight() {
-  HDC screen = GetDC(nullptr);
-  TEXTMETRICA metrics{};
-  GetTextMetricsA(screen, &metrics);
-  ReleaseDC(nullptr, screen);
-  return metrics.tmHeight + 2 + GetSystemMetrics(SM_CYEDGE);
-}
-
 // The same windows a step makes for one row, made bare on this thread: plain child windows
 // painted with the row's previews, edit controls beneath, all destroyed again.
 double BareRowMs(HWND parent, int firstRecord, int rowStep) {
@@ -120,14 +108,6 @@ void ShowOnly(HWND shown, HWND hidden) {
   ShowWindow(hidden, SW_HIDE);
   ShowWindow(shown, SW_SHOWNA);
   RedrawWindow(shown, nullptr, nullptr, RDW_INVALIDATE | RDW_ERASE | RDW_ALLCHILDREN | RDW_UPDATENOW);
-}
-
-HWND FindFrame() {
-  for (int waited = 0; waited < 60000; waited += 50) {
-    if (HWND frame = FindWindowA("FwFrame128", nullptr); frame && IsWindowVisible(frame)) return frame;
-    Sleep(50);
-  }
-  return nullptr;
 }
 
 void Measure(HWND frame) {
@@ -167,7 +147,7 @@ void Measure(HWND frame) {
     ShowOnly(canvas, frame);
     devhostPreviewClearCache();
     start = NowMs();
-    ScanFolder(kFolder, ".dwg");
+    ScanFolder(kViewBenchFolder, ".dwg");
     for (int row = 0; row < kVisibleRows; ++row)
       for (int c = 0; c < kColumns; ++c) {
         HWND picture = CreateWindowExA(0, "STATIC", "", WS_CHILD | WS_VISIBLE, c * 178, row * rowStep, 173, 143, canvas, nullptr,
@@ -231,22 +211,4 @@ void Measure(HWND frame) {
 }
 }  // namespace
 
-int main() {
-  if (GetFileAttributesA(kFolder) == INVALID_FILE_ATTRIBUTES) {
-    std::fprintf(stderr, "bench_thumbview: %s is missing (target thumbview_bench_folder makes it)\n", kFolder);
-    return 1;
-  }
-  OleInitialize(nullptr);
-  {
-    StateFileGuard state;  // the browse remembers the bench folder: the state file is put back after
-    LoadedModule module;
-    std::thread watcher([] {
-      if (HWND frame = FindFrame()) Measure(frame);
-    });
-    devhostInvoke(L"Lumvex", acutBuildList(RTSHORT, 0, RTSHORT, 0, RTSTR, kFolderW, RTSTR, L"Insert", RTSTR, L"Close", 0));
-    watcher.join();
-    devhostClearResult();
-  }
-  OleUninitialize();
-  return 0;
-}
+int main() { return RunViewBench("bench_thumbview", Measure); }
