@@ -56,16 +56,11 @@ void Measure(HWND frame) {
   HWND view = GetDlgItem(GetDlgItem(frame, kPaneFirst), kPaneFirst + 1);
   HWND box = Children(ToolBars(frame)[0], "Edit")[0];
   const int rowStep = 143 + CaptionHeight();
-  for (int waited = 0; waited < 10000 && Children(view, "FwWnd").empty(); waited += 50) Sleep(50);
-  SendMessageA(view, WM_NULL, 0, 0);
-  RECT client, window;
-  GetClientRect(view, &client);
-  GetWindowRect(frame, &window);
-  SetWindowPos(frame, nullptr, 0, 0, window.right - window.left + 1100 - client.right,
-               window.bottom - window.top + kVisibleRows * rowStep - client.bottom, SWP_NOZORDER);
+  SizeViewForBench(frame, view, kVisibleRows, rowStep);
   // The fit makes the client exactly the columns wide; from then on it moves nothing.
   SendMessageA(frame, WM_COMMAND, kFitCommand, 0);
   SendMessageA(view, WM_NULL, 0, 0);
+  RECT client;
   GetClientRect(view, &client);
   if (client.bottom / rowStep != kVisibleRows || (client.right + 5) / 178 != kColumns)
     std::fprintf(stderr, "bench_search: the view shows %ld rows of %ld columns, not %d of %d\n", client.bottom / rowStep,

@@ -116,16 +116,10 @@ void Measure(HWND frame) {
   // The view's client: 6 columns of 178 pixels (the last without its gap) and 4 whole rows, set
   // once the browse has built its first tiles and settled.
   const int ringTiles = (kVisibleRows + 2) * kColumns;
-  for (int waited = 0; waited < 10000 && CountWindows(view, "FwWnd") == 0; waited += 50) Sleep(50);
-  SendMessageA(view, WM_NULL, 0, 0);
-  RECT client, window;
-  GetClientRect(view, &client);
-  GetWindowRect(frame, &window);
-  // At the screen's top left corner, so that the screen's height does not cut the frame short.
-  SetWindowPos(frame, nullptr, 0, 0, window.right - window.left + 1100 - client.right,
-               window.bottom - window.top + kVisibleRows * rowStep - client.bottom, SWP_NOZORDER);
+  SizeViewForBench(frame, view, kVisibleRows, rowStep);
   // The frame lays its panes out once it is idle: wait for the view's ring of rows.
   for (int waited = 0; waited < 10000 && CountWindows(view, "FwWnd") != ringTiles; waited += 50) Sleep(50);
+  RECT client;
   GetClientRect(view, &client);
   if (client.bottom / rowStep != kVisibleRows)
     std::fprintf(stderr, "bench_thumbview: the view shows %ld rows, not %d\n", client.bottom / rowStep, kVisibleRows);

@@ -30,6 +30,19 @@ inline HWND FindFrame() {
   return nullptr;
 }
 
+// Once the browse has built its first tiles, sizes the frame so that the view's client is 1,100
+// pixels wide (6 columns of 178, the last without its gap) and `rows` whole rows high, at the
+// screen's top left corner so that the screen's height does not cut the frame short.
+inline void SizeViewForBench(HWND frame, HWND view, int rows, int rowStep) {
+  for (int waited = 0; waited < 10000 && Children(view, "FwWnd").empty(); waited += 50) Sleep(50);
+  SendMessageA(view, WM_NULL, 0, 0);
+  RECT client, window;
+  GetClientRect(view, &client);
+  GetWindowRect(frame, &window);
+  SetWindowPos(frame, nullptr, 0, 0, window.right - window.left + 1100 - client.right,
+               window.bottom - window.top + rows * rowStep - client.bottom, SWP_NOZORDER);
+}
+
 // Browses the bench folder and runs measure(frame) once the frame shows; the program's exit code.
 inline int RunViewBench(const char *program, void (*measure)(HWND frame)) {
   if (GetFileAttributesA(kViewBenchFolder) == INVALID_FILE_ATTRIBUTES) {
